@@ -1,0 +1,10 @@
+#include "item.h"
+
+namespace Pelkan {
+
+Item::Item(QQuickItem *parent)
+    : QQuickItem(parent)
+{
+}
+
+} // namespace Pelkan

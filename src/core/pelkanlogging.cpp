@@ -1,0 +1,6 @@
+#include "pelkanlogging.h"
+
+Q_LOGGING_CATEGORY(lcPelkanCoreLog, "org.quorvaneos.pelkan.core", QtWarningMsg)
+Q_LOGGING_CATEGORY(lcPelkanConfigLog, "org.quorvaneos.pelkan.config", QtWarningMsg)
+Q_LOGGING_CATEGORY(lcPelkanThemeLog, "org.quorvaneos.pelkan.theme", QtWarningMsg)
+Q_LOGGING_CATEGORY(lcPelkanServicesLog, "org.quorvaneos.pelkan.services", QtWarningMsg)

@@ -1,0 +1,217 @@
+#include "theme.h"
+#include "mgconfitem.h"
+#include "pelkanlogging.h"
+#include "screen.h"
+
+#include <QCoreApplication>
+#include <QDir>
+#include <QFileInfo>
+#include <QPointer>
+#include <QtMath>
+
+#include <dlfcn.h>
+
+namespace Pelkan {
+
+namespace {
+
+const char *const ColorKeys[Theme::ColorRoleCount] = {
+    "primary_color",
+    "secondary_color",
+    "highlight_color",
+    "secondary_highlight_color",
+    "highlight_background_color",
+    "overlay_background_color",
+};
+
+// Opacity of the secondary colours when they are derived from the primary ones.
+const qreal SecondaryOpacity = 0.6;
+
+QColor withAlpha(QColor color, qreal alpha)
+{
+    color.setAlphaF(alpha);
+    return color;
+}
+
+} // namespace
+
+Theme *Theme::instance()
+{
+    static QPointer<Theme> s_instance;
+    if (!s_instance)
+        s_instance = new Theme(QCoreApplication::instance());
+    return s_instance;
+}
+
+Theme::Theme(QObject *parent)
+    : QObject(parent)
+{
+    auto watch = [this](const char *name) {
+        auto item = new MGConfItem(configurationPath() + QLatin1String(name), this);
+        connect(item, &MGConfItem::valueChanged, this, &Theme::reload);
+        return item;
+    };
+    m_pixelRatioConfig = watch("pixel_ratio");
+    m_schemeConfig = watch("color_scheme");
+    m_directoryConfig = watch("directory");
+    for (const char *key : ColorKeys)
+        m_colorConfig.append(watch(key));
+
+    connect(Screen::instance(), &Screen::geometryChanged, this, &Theme::reload);
+    m_state = readState();
+}
+
+Theme::~Theme() = default;
+
+QString Theme::configurationPath()
+{
+    return QStringLiteral("/desktop/quorvane/pelkan/theme/");
+}
+
+void (Theme::*Theme::colorSignal(ColorRole role))()
+{
+    static void (Theme::*const notifiers[ColorRoleCount])() = {
+        &Theme::primaryColorChanged,
+        &Theme::secondaryColorChanged,
+        &Theme::highlightColorChanged,
+        &Theme::secondaryHighlightColorChanged,
+        &Theme::highlightBackgroundColorChanged,
+        &Theme::overlayBackgroundColorChanged,
+    };
+    return notifiers[role];
+}
+
+QSize Theme::scaledSize(int width, int height) const
+{
+    return QSize(qRound(width * m_state.pixelRatio), qRound(height * m_state.pixelRatio));
+}
+
+QColor Theme::rgba(const QColor &color, qreal opacity) const
+{
+    return withAlpha(color, qBound<qreal>(0.0, opacity, 1.0));
+}
+
+QString Theme::highlightText(const QString &text, const QString &pattern, const QColor &color) const
+{
+    if (pattern.isEmpty())
+        return text.toHtmlEscaped();
+
+    const QString open = QStringLiteral("<font color=\"%1\">").arg(color.name(QColor::HexArgb));
+    QString result;
+    int from = 0;
+    for (int at = text.indexOf(pattern, 0, Qt::CaseInsensitive); at >= 0;
+         at = text.indexOf(pattern, from, Qt::CaseInsensitive)) {
+        result += text.mid(from, at - from).toHtmlEscaped();
+        result += open + text.mid(at, pattern.size()).toHtmlEscaped() + QLatin1String("</font>");
+        from = at + pattern.size();
+    }
+    result += text.mid(from).toHtmlEscaped();
+    return result;
+}
+
+void Theme::reload()
+{
+    const State old = m_state;
+    m_state = readState();
+
+    if (!qFuzzyCompare(old.pixelRatio, m_state.pixelRatio))
+        Q_EMIT pixelRatioChanged();
+    if (old.scheme != m_state.scheme)
+        Q_EMIT colorSchemeChanged();
+    for (int role = 0; role < ColorRoleCount; ++role) {
+        if (old.colors.at(role) != m_state.colors.at(role))
+            Q_EMIT (this->*colorSignal(ColorRole(role)))();
+    }
+    if (old.directory != m_state.directory)
+        Q_EMIT themeDirectoryChanged();
+}
+
+Theme::State Theme::readState() const
+{
+    State state;
+    state.pixelRatio = readPixelRatio();
+    state.scheme = readScheme();
+    state.directory = readDirectory();
+
+    const bool dark = state.scheme == DarkOnLight;
+    QVector<QColor> &c = state.colors;
+    c[PrimaryColor] = readColor(PrimaryColor, dark ? QColor(0x00, 0x00, 0x00) : QColor(0xff, 0xff, 0xff));
+    c[HighlightColor] = readColor(HighlightColor, dark ? QColor(0x00, 0x66, 0xb3) : QColor(0x4d, 0xb8, 0xff));
+    c[SecondaryColor] = readColor(SecondaryColor, withAlpha(c[PrimaryColor], SecondaryOpacity));
+    c[SecondaryHighlightColor] = readColor(SecondaryHighlightColor, withAlpha(c[HighlightColor], SecondaryOpacity));
+    c[HighlightBackgroundColor] = readColor(HighlightBackgroundColor, c[HighlightColor]);
+    c[OverlayBackgroundColor] = readColor(OverlayBackgroundColor, dark ? QColor(0xff, 0xff, 0xff) : QColor(0x00, 0x00, 0x00));
+    return state;
+}
+
+qreal Theme::readPixelRatio() const
+{
+    const QVariant configured = m_pixelRatioConfig->value();
+    if (configured.isValid()) {
+        bool ok = false;
+        const qreal ratio = configured.toReal(&ok);
+        if (ok && ratio > 0 && ratio <= 10)
+            return ratio;
+        qCWarning(lcPelkanThemeLog) << "Theme: ignoring invalid pixel ratio" << configured;
+    }
+    // Quarter steps keep metrics on whole pixels for the common display widths.
+    return qMax<qreal>(1.0, qRound(Screen::instance()->widthRatio() * 4) / 4.0);
+}
+
+Theme::ColorScheme Theme::readScheme() const
+{
+    const QVariant configured = m_schemeConfig->value();
+    if (!configured.isValid())
+        return LightOnDark;
+    const QString name = configured.toString().toLower();
+    if (name == QLatin1String("lightondark"))
+        return LightOnDark;
+    if (name == QLatin1String("darkonlight"))
+        return DarkOnLight;
+    qCWarning(lcPelkanThemeLog) << "Theme: ignoring invalid colour scheme" << configured;
+    return LightOnDark;
+}
+
+QColor Theme::readColor(ColorRole role, const QColor &fallback) const
+{
+    const QVariant configured = m_colorConfig.at(role)->value();
+    if (!configured.isValid())
+        return fallback;
+    const QColor color(configured.toString());
+    if (color.isValid())
+        return color;
+    qCWarning(lcPelkanThemeLog) << "Theme: ignoring invalid colour" << configured << "in"
+                                << m_colorConfig.at(role)->key();
+    return fallback;
+}
+
+QString Theme::readDirectory() const
+{
+    const QVariant configured = m_directoryConfig->value();
+    if (configured.isValid()) {
+        const QString path = configured.toString();
+        if (QFileInfo(path).isDir())
+            return QDir::cleanPath(path);
+        qCWarning(lcPelkanThemeLog) << "Theme: ignoring missing theme directory" << path;
+    }
+    return defaultThemeDirectory();
+}
+
+QString Theme::defaultThemeDirectory()
+{
+    static const QString directory = [] {
+        const QString installed = QStringLiteral(PELKAN_THEME_INSTALL_DIR);
+        // Next to this library in a build tree (lib/ beside share/), or a relocated install.
+        Dl_info info;
+        if (dladdr(reinterpret_cast<void *>(&Theme::defaultThemeDirectory), &info) && info.dli_fname) {
+            const QString beside = QFileInfo(QString::fromLocal8Bit(info.dli_fname)).absolutePath()
+                    + QLatin1String("/../share/quorvane-pelkan/theme");
+            if (QFileInfo(beside).isDir())
+                return QDir::cleanPath(beside);
+        }
+        return installed;
+    }();
+    return directory;
+}
+
+} // namespace Pelkan

@@ -1,0 +1,86 @@
+#include "moduleregistration.h"
+
+#include "coreregistration.h"
+#include "palette.h"
+#include "screen.h"
+#include "theme.h"
+
+#include "declarativebusyindicatorsize.h"
+#include "declarativedatetime.h"
+#include "declarativedialogresult.h"
+#include "declarativedialogstatus.h"
+#include "declarativedock.h"
+#include "declarativefocusbehavior.h"
+#include "declarativeopacityramp.h"
+#include "declarativeorientation.h"
+#include "declarativepagenavigation.h"
+#include "declarativepagestackaction.h"
+#include "declarativepagestatus.h"
+#include "declarativetabviewaction.h"
+#include "declarativetouchinteraction.h"
+#include "declarativetruncationmode.h"
+#include "timepickermode.h"
+
+#include <QAbstractItemModel>
+#include <QQmlEngine>
+#include <QQuickItem>
+#include <QQuickWindow>
+
+namespace {
+
+template <typename T>
+void registerSingleton(const char *uri, const char *name)
+{
+    qmlRegisterSingletonType<T>(uri, 1, 0, name, [](QQmlEngine *, QJSEngine *) -> QObject * {
+        return new T;
+    });
+}
+
+template <typename T>
+void registerUncreatable(const char *uri, const char *name)
+{
+    qmlRegisterUncreatableType<T>(uri, 1, 0, name, QString());
+}
+
+} // namespace
+
+namespace ModuleRegistration {
+
+void registerPublicModule(const char *uri)
+{
+    Pelkan::Private::registerTypes(uri);
+    qmlRegisterRevision<QQuickItem, 1>(uri, 1, 0);
+    registerSingleton<Pelkan::Theme>(uri, "Theme");
+    registerSingleton<Pelkan::Screen>(uri, "Screen");
+    registerUncreatable<DeclarativePageStatus>(uri, "PageStatus");
+    registerUncreatable<DeclarativePageNavigation>(uri, "PageNavigation");
+    registerUncreatable<DeclarativeDialogStatus>(uri, "DialogStatus");
+    registerUncreatable<DeclarativeDialogResult>(uri, "DialogResult");
+    registerUncreatable<DeclarativeFocusBehavior>(uri, "FocusBehavior");
+    registerUncreatable<DeclarativeOpacityRamp>(uri, "OpacityRamp");
+    registerUncreatable<DeclarativeTouchInteraction>(uri, "TouchInteraction");
+    registerUncreatable<DeclarativeOrientation>(uri, "Orientation");
+    registerUncreatable<DeclarativeTruncationMode>(uri, "TruncationMode");
+    registerUncreatable<DeclarativeDateTime>(uri, "DateTime");
+    registerUncreatable<DeclarativePageStackAction>(uri, "PageStackAction");
+    registerUncreatable<DeclarativeTabViewAction>(uri, "TabViewAction");
+    registerUncreatable<DeclarativeDock>(uri, "Dock");
+    qmlRegisterAnonymousType<QAbstractItemModel>(uri, 1);
+    qmlRegisterType<Pelkan::Palette>(uri, 1, 0, "Palette");
+    registerUncreatable<DeclarativeBusyIndicatorSize>(uri, "BusyIndicatorSize");
+}
+
+void registerPrivateModule(const char *uri)
+{
+    Pelkan::Private::registerPrivateTypes(uri);
+    qmlRegisterRevision<QQuickItem, 1>(uri, 1, 0);
+    qmlRegisterRevision<QQuickWindow, 1>(uri, 1, 0);
+    registerUncreatable<TimePickerMode>(uri, "TimePickerMode");
+}
+
+void registerThemeModule(const char *uri)
+{
+    registerSingleton<Pelkan::Theme>(uri, "Theme");
+}
+
+} // namespace ModuleRegistration

@@ -1,0 +1,8 @@
+#include "translator.h"
+
+#include <QCoreApplication>
+
+QuorvanePelkanPlugin::Translator::~Translator()
+{
+    QCoreApplication::removeTranslator(this);
+}
