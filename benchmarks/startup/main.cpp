@@ -1,0 +1,92 @@
+// Start-up time of a one-page document: from the creation of the QML engine to the first
+// frame on screen, for the same page written with Quorvane Pelkan, Qt Quick Controls 2
+// and Kirigami.
+//
+//   pelkan-startup-bench [--runs N]   runs every document N times, each in a fresh process
+//                                      (modules load once per process), interleaved, and
+//                                      prints medians and ratios against Pelkan
+//   pelkan-startup-bench --once DOC   one measurement; prints milliseconds
+
+#include <QElapsedTimer>
+#include <QGuiApplication>
+#include <QProcess>
+#include <QQmlEngine>
+#include <QQuickView>
+#include <QTextStream>
+#include <QTimer>
+
+#include <algorithm>
+#include <map>
+#include <vector>
+
+static const char *const Documents[] = { "pelkan", "qqc2", "kirigami" };
+
+static int measureOnce(const QString &name)
+{
+    QElapsedTimer timer;
+    timer.start();
+    QQuickView view;
+    view.engine()->addImportPath(QStringLiteral(PELKAN_QML_DIR));
+    view.setSource(QUrl::fromLocalFile(QStringLiteral(DOCUMENTS_DIR "/") + name + QStringLiteral(".qml")));
+    if (view.status() != QQuickView::Ready) {
+        QTextStream(stderr) << "cannot load " << name << "\n";
+        return 1;
+    }
+    QObject::connect(&view, &QQuickWindow::frameSwapped, &view, [&] {
+        QObject::disconnect(&view, &QQuickWindow::frameSwapped, nullptr, nullptr);
+        QTextStream(stdout) << double(timer.nsecsElapsed()) / 1e6 << Qt::endl;
+        QCoreApplication::exit(0);
+    }, Qt::DirectConnection);
+    QTimer::singleShot(30000, [] { QCoreApplication::exit(1); });
+    view.show();
+    return QGuiApplication::exec();
+}
+
+static double median(std::vector<double> values)
+{
+    std::sort(values.begin(), values.end());
+    const size_t n = values.size();
+    return n % 2 ? values[n / 2] : (values[n / 2 - 1] + values[n / 2]) / 2;
+}
+
+int main(int argc, char *argv[])
+{
+    QGuiApplication app(argc, argv);
+    const QStringList args = app.arguments();
+    const int once = args.indexOf(QStringLiteral("--once"));
+    if (once > 0 && once + 1 < args.size())
+        return measureOnce(args.at(once + 1));
+
+    const int runsAt = args.indexOf(QStringLiteral("--runs"));
+    const int runs = runsAt > 0 && runsAt + 1 < args.size() ? args.at(runsAt + 1).toInt() : 15;
+
+    QTextStream out(stdout);
+    std::map<QString, std::vector<double>> times;
+    // One warm-up round fills the disk cache for every document alike.
+    for (int round = -1; round < runs; ++round) {
+        for (const char *document : Documents) {
+            QProcess child;
+            child.start(app.applicationFilePath(), { QStringLiteral("--once"), QString::fromLatin1(document) });
+            if (!child.waitForFinished(60000) || child.exitCode() != 0) {
+                out << "failed: " << document << " " << child.readAllStandardError() << "\n";
+                return 1;
+            }
+            if (round >= 0)
+                times[QString::fromLatin1(document)].push_back(child.readAllStandardOutput().split('\n').first().toDouble());
+        }
+    }
+
+    const double reference = median(times[QStringLiteral("pelkan")]);
+    out << "Start-up to first frame, median of " << runs << " fresh processes each:\n";
+    for (const char *document : Documents) {
+        const std::vector<double> &values = times[QString::fromLatin1(document)];
+        const double m = median(values);
+        out << QStringLiteral("  %1 %2 ms (min %3, max %4), %5x Pelkan\n")
+                   .arg(QString::fromLatin1(document), -9)
+                   .arg(m, 7, 'f', 1)
+                   .arg(*std::min_element(values.begin(), values.end()), 0, 'f', 1)
+                   .arg(*std::max_element(values.begin(), values.end()), 0, 'f', 1)
+                   .arg(m / reference, 0, 'f', 2);
+    }
+    return 0;
+}

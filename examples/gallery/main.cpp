@@ -1,0 +1,42 @@
+// The gallery: every component of the toolkit on one page per subject.
+//
+//   pelkan-gallery                       opens the gallery in a window
+//   pelkan-gallery --screenshot out.png  renders it once and saves a picture
+
+#include "screenshotter.h"
+
+#include <QCommandLineParser>
+#include <QDir>
+#include <QGuiApplication>
+#include <QQmlApplicationEngine>
+#include <QQuickWindow>
+
+int main(int argc, char *argv[])
+{
+    QGuiApplication app(argc, argv);
+    app.setApplicationName(QStringLiteral("pelkan-gallery"));
+
+    QCommandLineParser parser;
+    parser.setApplicationDescription(QStringLiteral("Quorvane Pelkan component gallery"));
+    parser.addHelpOption();
+    const QCommandLineOption screenshot(QStringLiteral("screenshot"),
+                                        QStringLiteral("Render once, save a PNG to <file> and quit."),
+                                        QStringLiteral("file"));
+    parser.addOption(screenshot);
+    parser.process(app);
+
+    QQmlApplicationEngine engine;
+    // Run from a build tree, use its modules rather than installed ones.
+    const QString buildModules = QCoreApplication::applicationDirPath() + QStringLiteral("/../qml");
+    if (QDir(buildModules + QStringLiteral("/Quorvane/Pelkan")).exists())
+        engine.addImportPath(buildModules);
+
+    engine.load(QUrl(QStringLiteral("qrc:/gallery/main.qml")));
+    auto window = engine.rootObjects().isEmpty() ? nullptr : qobject_cast<QQuickWindow *>(engine.rootObjects().first());
+    if (!window)
+        return 1;
+
+    if (parser.isSet(screenshot))
+        new Screenshotter(window, parser.value(screenshot), &app);
+    return app.exec();
+}
