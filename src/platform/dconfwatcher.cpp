@@ -2,6 +2,7 @@
 #include "mgconfitem.h"
 
 #include <QGlobalStatic>
+#include <QPointer>
 
 extern "C" {
 #include <dconf.h>
@@ -57,19 +58,23 @@ void DConfWatcher::changed(DConfClient *, const char *prefix, const char *const 
 
 void DConfWatcher::notify(const QString &path)
 {
-    // Collect first: an item's valueChanged handler may create or destroy items.
-    QVector<MGConfItem *> affected;
+    // Collect first, guarded: an item's valueChanged handler may create or destroy items.
+    QVector<QPointer<MGConfItem>> affected;
+    auto collect = [&affected](const QVector<MGConfItem *> &items) {
+        for (MGConfItem *item : items)
+            affected.append(item);
+    };
     if (path.endsWith(QLatin1Char('/'))) {
         for (auto it = m_items.cbegin(); it != m_items.cend(); ++it) {
             if (it.key().startsWith(path))
-                affected += it.value();
+                collect(it.value());
         }
     } else {
-        affected = m_items.value(path);
+        collect(m_items.value(path));
     }
 
-    for (MGConfItem *item : qAsConst(affected)) {
-        if (m_items.value(item->key()).contains(item))
+    for (const QPointer<MGConfItem> &item : qAsConst(affected)) {
+        if (item)
             item->refresh();
     }
 }
