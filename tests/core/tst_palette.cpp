@@ -19,7 +19,6 @@ private Q_SLOTS:
     void droppedParentFallsBackToTheme();
     void controlsInheritFromNearestAncestorControl();
     void controlAddedUnderPlainItemInherits();
-    void highlighted();
 };
 
 void tst_Palette::followsThemeUntilSet_data()
@@ -119,16 +118,6 @@ void tst_Palette::controlAddedUnderPlainItemInherits()
 
     container.setParentItem(&page);
     QCOMPARE(button.palette()->inheritedPalette(), page.palette());
-}
-
-void tst_Palette::highlighted()
-{
-    Control control;
-    QSignalSpy changed(&control, &Control::highlightedChanged);
-    control.setHighlighted(true);
-    control.setHighlighted(true);
-    QVERIFY(control.highlighted());
-    QCOMPARE(changed.count(), 1);
 }
 
 QTEST_MAIN(tst_Palette)

@@ -19,7 +19,6 @@ private Q_SLOTS:
 
     void categoryForDiagonal_data();
     void categoryForDiagonal();
-    void portraitGeometryOfPrimaryScreen();
     void configuredDiagonalOverridesDisplay();
     void invalidDiagonalIsIgnored();
 };
@@ -28,12 +27,9 @@ void tst_Screen::categoryForDiagonal_data()
 {
     QTest::addColumn<qreal>("inches");
     QTest::addColumn<int>("category");
-    QTest::newRow("watch") << 1.5 << int(Screen::Small);
     QTest::newRow("just below medium") << 4.49 << int(Screen::Small);
     QTest::newRow("medium starts") << 4.5 << int(Screen::Medium);
-    QTest::newRow("phone") << 6.1 << int(Screen::Medium);
     QTest::newRow("large starts") << 7.0 << int(Screen::Large);
-    QTest::newRow("tablet") << 10.1 << int(Screen::Large);
     QTest::newRow("extra large starts") << 11.0 << int(Screen::ExtraLarge);
     QTest::newRow("monitor") << 24.0 << int(Screen::ExtraLarge);
 }
@@ -43,16 +39,6 @@ void tst_Screen::categoryForDiagonal()
     QFETCH(qreal, inches);
     QFETCH(int, category);
     QCOMPARE(int(Screen::categoryForDiagonal(inches)), category);
-}
-
-void tst_Screen::portraitGeometryOfPrimaryScreen()
-{
-    Screen screen;
-    const QSize pixels = QGuiApplication::primaryScreen()->geometry().size()
-            * QGuiApplication::primaryScreen()->devicePixelRatio();
-    QCOMPARE(screen.width(), qMin(pixels.width(), pixels.height()));
-    QCOMPARE(screen.height(), qMax(pixels.width(), pixels.height()));
-    QCOMPARE(screen.widthRatio(), screen.width() / 540.0);
 }
 
 void tst_Screen::configuredDiagonalOverridesDisplay()

@@ -35,8 +35,6 @@ private Q_SLOTS:
     void invalidColourIsIgnored();
     void colourSchemeChangesDefaults();
     void themeDirectory();
-    void rgba_data();
-    void rgba();
     void highlightText_data();
     void highlightText();
 };
@@ -179,25 +177,6 @@ void tst_Theme::themeDirectory()
     QVERIFY(ConfigFixture::write(key("directory"), QStringLiteral("'/nonexistent/theme'")));
     QTRY_COMPARE(changed.count(), 2);
     QCOMPARE(theme.themeDirectory(), builtIn);
-}
-
-void tst_Theme::rgba_data()
-{
-    QTest::addColumn<QColor>("color");
-    QTest::addColumn<qreal>("opacity");
-    QTest::addColumn<QColor>("expected");
-    QTest::newRow("half") << QColor(Qt::red) << 0.5 << QColor::fromRgbF(1, 0, 0, 0.5);
-    QTest::newRow("replaces alpha") << QColor::fromRgbF(0, 0, 1, 0.2) << 1.0 << QColor(Qt::blue);
-    QTest::newRow("clamped high") << QColor(Qt::green) << 3.0 << QColor(Qt::green);
-    QTest::newRow("clamped low") << QColor(Qt::green) << -1.0 << QColor::fromRgbF(0, 1, 0, 0);
-}
-
-void tst_Theme::rgba()
-{
-    QFETCH(QColor, color);
-    QFETCH(qreal, opacity);
-    QFETCH(QColor, expected);
-    QCOMPARE(Theme::instance()->rgba(color, opacity), expected);
 }
 
 void tst_Theme::highlightText_data()
