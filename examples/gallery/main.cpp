@@ -2,6 +2,7 @@
 //
 //   pelkan-gallery                       opens the gallery in a window
 //   pelkan-gallery --screenshot out.png  renders it once and saves a picture
+//   pelkan-gallery --page orientation    opens on another page
 
 #include "screenshotter.h"
 
@@ -23,6 +24,9 @@ int main(int argc, char *argv[])
                                         QStringLiteral("Render once, save a PNG to <file> and quit."),
                                         QStringLiteral("file"));
     parser.addOption(screenshot);
+    const QCommandLineOption page(QStringLiteral("page"), QStringLiteral("Open on <page>: theme, orientation."),
+                                  QStringLiteral("page"), QStringLiteral("theme"));
+    parser.addOption(page);
     parser.process(app);
 
     QQmlApplicationEngine engine;
@@ -31,6 +35,7 @@ int main(int argc, char *argv[])
     if (QDir(buildModules + QStringLiteral("/Quorvane/Pelkan")).exists())
         engine.addImportPath(buildModules);
 
+    engine.setInitialProperties({ { QStringLiteral("initialPage"), parser.value(page) } });
     engine.load(QUrl(QStringLiteral("qrc:/gallery/main.qml")));
     auto window = engine.rootObjects().isEmpty() ? nullptr : qobject_cast<QQuickWindow *>(engine.rootObjects().first());
     if (!window)

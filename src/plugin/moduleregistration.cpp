@@ -1,6 +1,7 @@
 #include "moduleregistration.h"
 
 #include "coreregistration.h"
+#include "declarativewindow.h"
 #include "palette.h"
 #include "screen.h"
 #include "theme.h"
@@ -75,6 +76,7 @@ void registerPrivateModule(const char *uri)
     Pelkan::Private::registerPrivateTypes(uri);
     qmlRegisterRevision<QQuickItem, 1>(uri, 1, 0);
     qmlRegisterRevision<QQuickWindow, 1>(uri, 1, 0);
+    qmlRegisterType<DeclarativeWindow>(uri, 1, 0, "Window");
     registerUncreatable<TimePickerMode>(uri, "TimePickerMode");
 }
 

@@ -148,6 +148,7 @@ void tst_Registration::creatableTypes_data()
     QTest::newRow("Palette") << QByteArray("Palette") << QByteArray("Pelkan::Palette");
     QTest::newRow("ItemBase") << QByteArray("Private.ItemBase") << QByteArray("Pelkan::Item");
     QTest::newRow("ControlBase") << QByteArray("Private.ControlBase") << QByteArray("Pelkan::Control");
+    QTest::newRow("Window") << QByteArray("Private.Window") << QByteArray("DeclarativeWindow");
 }
 
 void tst_Registration::creatableTypes()

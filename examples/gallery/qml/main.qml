@@ -1,9 +1,14 @@
 import QtQuick 2.6
 import QtQuick.Window 2.2
 import Quorvane.Pelkan 1.0
+import Quorvane.Pelkan.private 1.0 as Private
 
 Window {
     id: window
+
+    // Which page the gallery opens on ("theme", "orientation").
+    property string initialPage: "theme"
+
     visible: true
     // A phone-shaped window in the display's portrait pixels.
     width: Math.min(screen.width, Screen.width)
@@ -11,7 +16,39 @@ Window {
     title: "Quorvane Pelkan gallery"
     color: Theme.colorScheme === Theme.LightOnDark ? "#10141c" : "#f4f6fa"
 
-    ThemePage {
+    Private.Window {
+        id: applicationWindow
         anchors.fill: parent
+
+        Row {
+            id: tabs
+            property string current: window.initialPage
+            width: parent.width
+            height: Theme.itemSizeSmall
+
+            Repeater {
+                model: [{ name: "theme", title: "Theme" }, { name: "orientation", title: "Orientation" }]
+                Item {
+                    width: tabs.width / 2
+                    height: tabs.height
+                    Text {
+                        anchors.centerIn: parent
+                        text: modelData.title
+                        color: tabs.current === modelData.name ? Theme.highlightColor : Theme.secondaryColor
+                        font.pixelSize: Theme.fontSizeMedium
+                    }
+                    MouseArea {
+                        anchors.fill: parent
+                        onClicked: tabs.current = modelData.name
+                    }
+                }
+            }
+        }
+
+        Loader {
+            anchors { top: tabs.bottom; left: parent.left; right: parent.right; bottom: parent.bottom }
+            source: tabs.current === "orientation" ? "OrientationPage.qml" : "ThemePage.qml"
+            onLoaded: if (item.hasOwnProperty("applicationWindow")) item.applicationWindow = applicationWindow
+        }
     }
 }
