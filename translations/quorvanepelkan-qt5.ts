@@ -13,15 +13,496 @@
         <extracomment>Button that closes a dialog without accepting it</extracomment>
         <translation>Cancel</translation>
     </message>
+    <message id="quorvanepelkan-bytes" numerus="yes">
+        <source>%n bytes</source>
+        <extracomment>File size in bytes</extracomment>
+        <translation>
+            <numerusform>%n byte</numerusform>
+            <numerusform>%n bytes</numerusform>
+        </translation>
+    </message>
+    <message id="quorvanepelkan-date_format_full">
+        <source>cccc, d MMMM yyyy</source>
+        <extracomment>Full date pattern; cccc is the weekday</extracomment>
+        <translation>cccc, d MMMM yyyy</translation>
+    </message>
+    <message id="quorvanepelkan-date_format_full_without_year">
+        <source>cccc, d MMMM</source>
+        <extracomment>Full date pattern without the year; cccc is the weekday</extracomment>
+        <translation>cccc, d MMMM</translation>
+    </message>
+    <message id="quorvanepelkan-date_format_long">
+        <source>d MMMM yyyy</source>
+        <extracomment>Long date pattern; cccc is the weekday</extracomment>
+        <translation>d MMMM yyyy</translation>
+    </message>
+    <message id="quorvanepelkan-date_format_medium">
+        <source>d MMM yyyy</source>
+        <extracomment>Medium date pattern</extracomment>
+        <translation>d MMM yyyy</translation>
+    </message>
+    <message id="quorvanepelkan-days" numerus="yes">
+        <source>%n days ago</source>
+        <extracomment>Time elapsed in days</extracomment>
+        <translation>
+            <numerusform>%n day ago</numerusform>
+            <numerusform>%n days ago</numerusform>
+        </translation>
+    </message>
+    <message id="quorvanepelkan-days-future" numerus="yes">
+        <source>in %n days</source>
+        <extracomment>Time until, in days</extracomment>
+        <translation>
+            <numerusform>in %n day</numerusform>
+            <numerusform>in %n days</numerusform>
+        </translation>
+    </message>
+    <message id="quorvanepelkan-days-future-short" numerus="yes">
+        <source>in %n d</source>
+        <extracomment>Time until, in days, short</extracomment>
+        <translation>
+            <numerusform>in %n d</numerusform>
+            <numerusform>in %n d</numerusform>
+        </translation>
+    </message>
+    <message id="quorvanepelkan-days-short" numerus="yes">
+        <source>%n d ago</source>
+        <extracomment>Time elapsed in days, short</extracomment>
+        <translation>
+            <numerusform>%n d ago</numerusform>
+            <numerusform>%n d ago</numerusform>
+        </translation>
+    </message>
+    <message id="quorvanepelkan-duration_long_format">
+        <source>h:mm:ss</source>
+        <extracomment>Duration pattern with hours</extracomment>
+        <translation>h:mm:ss</translation>
+    </message>
+    <message id="quorvanepelkan-duration_short_format">
+        <source>m:ss</source>
+        <extracomment>Duration pattern without hours</extracomment>
+        <translation>m:ss</translation>
+    </message>
+    <message id="quorvanepelkan-formatShortDate">
+        <source>%1 %3</source>
+        <extracomment>Day (%1) and month: numeric (%2) or abbreviated name (%3)</extracomment>
+        <translation>%1 %3</translation>
+    </message>
+    <message id="quorvanepelkan-formatTimepoint">
+        <source>%2, %1</source>
+        <extracomment>Time (%1) on a date or day (%2)</extracomment>
+        <translation>%2, %1</translation>
+    </message>
+    <message id="quorvanepelkan-gigabytes">
+        <source>%1 GB</source>
+        <extracomment>File size in gigabytes</extracomment>
+        <translation>%1 GB</translation>
+    </message>
     <message id="quorvanepelkan-he-back">
         <source>Back</source>
         <extracomment>Page header hint for going back to the previous page</extracomment>
         <translation>Back</translation>
     </message>
+    <message id="quorvanepelkan-hours" numerus="yes">
+        <source>%n hours ago</source>
+        <extracomment>Time elapsed in hours</extracomment>
+        <translation>
+            <numerusform>%n hour ago</numerusform>
+            <numerusform>%n hours ago</numerusform>
+        </translation>
+    </message>
+    <message id="quorvanepelkan-hours-future" numerus="yes">
+        <source>in %n hours</source>
+        <extracomment>Time until, in hours</extracomment>
+        <translation>
+            <numerusform>in %n hour</numerusform>
+            <numerusform>in %n hours</numerusform>
+        </translation>
+    </message>
+    <message id="quorvanepelkan-hours-future-short" numerus="yes">
+        <source>in %n h</source>
+        <extracomment>Time until, in hours, short</extracomment>
+        <translation>
+            <numerusform>in %n h</numerusform>
+            <numerusform>in %n h</numerusform>
+        </translation>
+    </message>
+    <message id="quorvanepelkan-hours-short" numerus="yes">
+        <source>%n h ago</source>
+        <extracomment>Time elapsed in hours, short</extracomment>
+        <translation>
+            <numerusform>%n h ago</numerusform>
+            <numerusform>%n h ago</numerusform>
+        </translation>
+    </message>
+    <message id="quorvanepelkan-kilobytes">
+        <source>%1 kB</source>
+        <extracomment>File size in kilobytes</extracomment>
+        <translation>%1 kB</translation>
+    </message>
     <message id="quorvanepelkan-la-no-items">
         <source>No items</source>
         <extracomment>Placeholder of an empty list</extracomment>
         <translation>No items</translation>
+    </message>
+    <message id="quorvanepelkan-megabytes">
+        <source>%1 MB</source>
+        <extracomment>File size in megabytes</extracomment>
+        <translation>%1 MB</translation>
+    </message>
+    <message id="quorvanepelkan-minutes" numerus="yes">
+        <source>%n minutes ago</source>
+        <extracomment>Time elapsed in minutes</extracomment>
+        <translation>
+            <numerusform>%n minute ago</numerusform>
+            <numerusform>%n minutes ago</numerusform>
+        </translation>
+    </message>
+    <message id="quorvanepelkan-minutes-future" numerus="yes">
+        <source>in %n minutes</source>
+        <extracomment>Time until, in minutes</extracomment>
+        <translation>
+            <numerusform>in %n minute</numerusform>
+            <numerusform>in %n minutes</numerusform>
+        </translation>
+    </message>
+    <message id="quorvanepelkan-minutes-future-short" numerus="yes">
+        <source>in %n min</source>
+        <extracomment>Time until, in minutes, short</extracomment>
+        <translation>
+            <numerusform>in %n min</numerusform>
+            <numerusform>in %n min</numerusform>
+        </translation>
+    </message>
+    <message id="quorvanepelkan-minutes-short" numerus="yes">
+        <source>%n min ago</source>
+        <extracomment>Time elapsed in minutes, short</extracomment>
+        <translation>
+            <numerusform>%n min ago</numerusform>
+            <numerusform>%n min ago</numerusform>
+        </translation>
+    </message>
+    <message id="quorvanepelkan-monthname_april_standalone">
+        <source>April</source>
+        <extracomment>Month name on its own</extracomment>
+        <translation>April</translation>
+    </message>
+    <message id="quorvanepelkan-monthname_april_standalone_capitalized">
+        <source>April</source>
+        <extracomment>Month name on its own, capitalised</extracomment>
+        <translation>April</translation>
+    </message>
+    <message id="quorvanepelkan-monthname_april_standalone_short">
+        <source>Apr</source>
+        <extracomment>Abbreviated month name</extracomment>
+        <translation>Apr</translation>
+    </message>
+    <message id="quorvanepelkan-monthname_august_standalone">
+        <source>August</source>
+        <extracomment>Month name on its own</extracomment>
+        <translation>August</translation>
+    </message>
+    <message id="quorvanepelkan-monthname_august_standalone_capitalized">
+        <source>August</source>
+        <extracomment>Month name on its own, capitalised</extracomment>
+        <translation>August</translation>
+    </message>
+    <message id="quorvanepelkan-monthname_august_standalone_short">
+        <source>Aug</source>
+        <extracomment>Abbreviated month name</extracomment>
+        <translation>Aug</translation>
+    </message>
+    <message id="quorvanepelkan-monthname_december_standalone">
+        <source>December</source>
+        <extracomment>Month name on its own</extracomment>
+        <translation>December</translation>
+    </message>
+    <message id="quorvanepelkan-monthname_december_standalone_capitalized">
+        <source>December</source>
+        <extracomment>Month name on its own, capitalised</extracomment>
+        <translation>December</translation>
+    </message>
+    <message id="quorvanepelkan-monthname_december_standalone_short">
+        <source>Dec</source>
+        <extracomment>Abbreviated month name</extracomment>
+        <translation>Dec</translation>
+    </message>
+    <message id="quorvanepelkan-monthname_february_standalone">
+        <source>February</source>
+        <extracomment>Month name on its own</extracomment>
+        <translation>February</translation>
+    </message>
+    <message id="quorvanepelkan-monthname_february_standalone_capitalized">
+        <source>February</source>
+        <extracomment>Month name on its own, capitalised</extracomment>
+        <translation>February</translation>
+    </message>
+    <message id="quorvanepelkan-monthname_february_standalone_short">
+        <source>Feb</source>
+        <extracomment>Abbreviated month name</extracomment>
+        <translation>Feb</translation>
+    </message>
+    <message id="quorvanepelkan-monthname_january_standalone">
+        <source>January</source>
+        <extracomment>Month name on its own</extracomment>
+        <translation>January</translation>
+    </message>
+    <message id="quorvanepelkan-monthname_january_standalone_capitalized">
+        <source>January</source>
+        <extracomment>Month name on its own, capitalised</extracomment>
+        <translation>January</translation>
+    </message>
+    <message id="quorvanepelkan-monthname_january_standalone_short">
+        <source>Jan</source>
+        <extracomment>Abbreviated month name</extracomment>
+        <translation>Jan</translation>
+    </message>
+    <message id="quorvanepelkan-monthname_july_standalone">
+        <source>July</source>
+        <extracomment>Month name on its own</extracomment>
+        <translation>July</translation>
+    </message>
+    <message id="quorvanepelkan-monthname_july_standalone_capitalized">
+        <source>July</source>
+        <extracomment>Month name on its own, capitalised</extracomment>
+        <translation>July</translation>
+    </message>
+    <message id="quorvanepelkan-monthname_july_standalone_short">
+        <source>Jul</source>
+        <extracomment>Abbreviated month name</extracomment>
+        <translation>Jul</translation>
+    </message>
+    <message id="quorvanepelkan-monthname_june_standalone">
+        <source>June</source>
+        <extracomment>Month name on its own</extracomment>
+        <translation>June</translation>
+    </message>
+    <message id="quorvanepelkan-monthname_june_standalone_capitalized">
+        <source>June</source>
+        <extracomment>Month name on its own, capitalised</extracomment>
+        <translation>June</translation>
+    </message>
+    <message id="quorvanepelkan-monthname_june_standalone_short">
+        <source>Jun</source>
+        <extracomment>Abbreviated month name</extracomment>
+        <translation>Jun</translation>
+    </message>
+    <message id="quorvanepelkan-monthname_march_standalone">
+        <source>March</source>
+        <extracomment>Month name on its own</extracomment>
+        <translation>March</translation>
+    </message>
+    <message id="quorvanepelkan-monthname_march_standalone_capitalized">
+        <source>March</source>
+        <extracomment>Month name on its own, capitalised</extracomment>
+        <translation>March</translation>
+    </message>
+    <message id="quorvanepelkan-monthname_march_standalone_short">
+        <source>Mar</source>
+        <extracomment>Abbreviated month name</extracomment>
+        <translation>Mar</translation>
+    </message>
+    <message id="quorvanepelkan-monthname_may_standalone">
+        <source>May</source>
+        <extracomment>Month name on its own</extracomment>
+        <translation>May</translation>
+    </message>
+    <message id="quorvanepelkan-monthname_may_standalone_capitalized">
+        <source>May</source>
+        <extracomment>Month name on its own, capitalised</extracomment>
+        <translation>May</translation>
+    </message>
+    <message id="quorvanepelkan-monthname_may_standalone_short">
+        <source>May</source>
+        <extracomment>Abbreviated month name</extracomment>
+        <translation>May</translation>
+    </message>
+    <message id="quorvanepelkan-monthname_november_standalone">
+        <source>November</source>
+        <extracomment>Month name on its own</extracomment>
+        <translation>November</translation>
+    </message>
+    <message id="quorvanepelkan-monthname_november_standalone_capitalized">
+        <source>November</source>
+        <extracomment>Month name on its own, capitalised</extracomment>
+        <translation>November</translation>
+    </message>
+    <message id="quorvanepelkan-monthname_november_standalone_short">
+        <source>Nov</source>
+        <extracomment>Abbreviated month name</extracomment>
+        <translation>Nov</translation>
+    </message>
+    <message id="quorvanepelkan-monthname_october_standalone">
+        <source>October</source>
+        <extracomment>Month name on its own</extracomment>
+        <translation>October</translation>
+    </message>
+    <message id="quorvanepelkan-monthname_october_standalone_capitalized">
+        <source>October</source>
+        <extracomment>Month name on its own, capitalised</extracomment>
+        <translation>October</translation>
+    </message>
+    <message id="quorvanepelkan-monthname_october_standalone_short">
+        <source>Oct</source>
+        <extracomment>Abbreviated month name</extracomment>
+        <translation>Oct</translation>
+    </message>
+    <message id="quorvanepelkan-monthname_september_standalone">
+        <source>September</source>
+        <extracomment>Month name on its own</extracomment>
+        <translation>September</translation>
+    </message>
+    <message id="quorvanepelkan-monthname_september_standalone_capitalized">
+        <source>September</source>
+        <extracomment>Month name on its own, capitalised</extracomment>
+        <translation>September</translation>
+    </message>
+    <message id="quorvanepelkan-monthname_september_standalone_short">
+        <source>Sep</source>
+        <extracomment>Abbreviated month name</extracomment>
+        <translation>Sep</translation>
+    </message>
+    <message id="quorvanepelkan-months" numerus="yes">
+        <source>%n months ago</source>
+        <extracomment>Time elapsed in months</extracomment>
+        <translation>
+            <numerusform>%n month ago</numerusform>
+            <numerusform>%n months ago</numerusform>
+        </translation>
+    </message>
+    <message id="quorvanepelkan-months-future" numerus="yes">
+        <source>in %n months</source>
+        <extracomment>Time until, in months</extracomment>
+        <translation>
+            <numerusform>in %n month</numerusform>
+            <numerusform>in %n months</numerusform>
+        </translation>
+    </message>
+    <message id="quorvanepelkan-months-future-short" numerus="yes">
+        <source>in %n mo</source>
+        <extracomment>Time until, in months, short</extracomment>
+        <translation>
+            <numerusform>in %n mo</numerusform>
+            <numerusform>in %n mo</numerusform>
+        </translation>
+    </message>
+    <message id="quorvanepelkan-months-short" numerus="yes">
+        <source>%n mo ago</source>
+        <extracomment>Time elapsed in months, short</extracomment>
+        <translation>
+            <numerusform>%n mo ago</numerusform>
+            <numerusform>%n mo ago</numerusform>
+        </translation>
+    </message>
+    <message id="quorvanepelkan-now">
+        <source>now</source>
+        <extracomment>Relative time of less than a minute</extracomment>
+        <translation>now</translation>
+    </message>
+    <message id="quorvanepelkan-older">
+        <source>Older</source>
+        <extracomment>Section of items more than a week old</extracomment>
+        <translation>Older</translation>
+    </message>
+    <message id="quorvanepelkan-terabytes">
+        <source>%1 TB</source>
+        <extracomment>File size in terabytes</extracomment>
+        <translation>%1 TB</translation>
+    </message>
+    <message id="quorvanepelkan-time_format_short_12h">
+        <source>h:mm AP</source>
+        <extracomment>Short time pattern, 12-hour clock</extracomment>
+        <translation>h:mm AP</translation>
+    </message>
+    <message id="quorvanepelkan-time_format_short_24h">
+        <source>hh:mm</source>
+        <extracomment>Short time pattern, 24-hour clock</extracomment>
+        <translation>hh:mm</translation>
+    </message>
+    <message id="quorvanepelkan-time_value_twelve_hours">
+        <source>h:mm AP</source>
+        <extracomment>Time pattern, 12-hour clock</extracomment>
+        <translation>h:mm AP</translation>
+    </message>
+    <message id="quorvanepelkan-time_value_twentyfour_hours">
+        <source>hh:mm</source>
+        <extracomment>Time pattern, 24-hour clock</extracomment>
+        <translation>hh:mm</translation>
+    </message>
+    <message id="quorvanepelkan-weekday_friday_standalone">
+        <source>Friday</source>
+        <extracomment>Weekday name on its own</extracomment>
+        <translation>Friday</translation>
+    </message>
+    <message id="quorvanepelkan-weekday_friday_standalone_capitalized">
+        <source>Friday</source>
+        <extracomment>Weekday name on its own, capitalised</extracomment>
+        <translation>Friday</translation>
+    </message>
+    <message id="quorvanepelkan-weekday_monday_standalone">
+        <source>Monday</source>
+        <extracomment>Weekday name on its own</extracomment>
+        <translation>Monday</translation>
+    </message>
+    <message id="quorvanepelkan-weekday_monday_standalone_capitalized">
+        <source>Monday</source>
+        <extracomment>Weekday name on its own, capitalised</extracomment>
+        <translation>Monday</translation>
+    </message>
+    <message id="quorvanepelkan-weekday_saturday_standalone">
+        <source>Saturday</source>
+        <extracomment>Weekday name on its own</extracomment>
+        <translation>Saturday</translation>
+    </message>
+    <message id="quorvanepelkan-weekday_saturday_standalone_capitalized">
+        <source>Saturday</source>
+        <extracomment>Weekday name on its own, capitalised</extracomment>
+        <translation>Saturday</translation>
+    </message>
+    <message id="quorvanepelkan-weekday_sunday_standalone">
+        <source>Sunday</source>
+        <extracomment>Weekday name on its own</extracomment>
+        <translation>Sunday</translation>
+    </message>
+    <message id="quorvanepelkan-weekday_sunday_standalone_capitalized">
+        <source>Sunday</source>
+        <extracomment>Weekday name on its own, capitalised</extracomment>
+        <translation>Sunday</translation>
+    </message>
+    <message id="quorvanepelkan-weekday_thursday_standalone">
+        <source>Thursday</source>
+        <extracomment>Weekday name on its own</extracomment>
+        <translation>Thursday</translation>
+    </message>
+    <message id="quorvanepelkan-weekday_thursday_standalone_capitalized">
+        <source>Thursday</source>
+        <extracomment>Weekday name on its own, capitalised</extracomment>
+        <translation>Thursday</translation>
+    </message>
+    <message id="quorvanepelkan-weekday_tuesday_standalone">
+        <source>Tuesday</source>
+        <extracomment>Weekday name on its own</extracomment>
+        <translation>Tuesday</translation>
+    </message>
+    <message id="quorvanepelkan-weekday_tuesday_standalone_capitalized">
+        <source>Tuesday</source>
+        <extracomment>Weekday name on its own, capitalised</extracomment>
+        <translation>Tuesday</translation>
+    </message>
+    <message id="quorvanepelkan-weekday_wednesday_standalone">
+        <source>Wednesday</source>
+        <extracomment>Weekday name on its own</extracomment>
+        <translation>Wednesday</translation>
+    </message>
+    <message id="quorvanepelkan-weekday_wednesday_standalone_capitalized">
+        <source>Wednesday</source>
+        <extracomment>Weekday name on its own, capitalised</extracomment>
+        <translation>Wednesday</translation>
+    </message>
+    <message id="quorvanepelkan-yesterday">
+        <source>Yesterday</source>
+        <extracomment>Section or time of the previous day</extracomment>
+        <translation>Yesterday</translation>
     </message>
 </context>
 </TS>

@@ -11,6 +11,7 @@
 #include <QGuiApplication>
 #include <QQmlApplicationEngine>
 #include <QQuickWindow>
+#include <QTranslator>
 
 int main(int argc, char *argv[])
 {
@@ -24,16 +25,24 @@ int main(int argc, char *argv[])
                                         QStringLiteral("Render once, save a PNG to <file> and quit."),
                                         QStringLiteral("file"));
     parser.addOption(screenshot);
-    const QCommandLineOption page(QStringLiteral("page"), QStringLiteral("Open on <page>: theme, orientation."),
+    const QCommandLineOption page(QStringLiteral("page"), QStringLiteral("Open on <page>: theme, orientation, format."),
                                   QStringLiteral("page"), QStringLiteral("theme"));
     parser.addOption(page);
     parser.process(app);
 
     QQmlApplicationEngine engine;
-    // Run from a build tree, use its modules rather than installed ones.
-    const QString buildModules = QCoreApplication::applicationDirPath() + QStringLiteral("/../qml");
-    if (QDir(buildModules + QStringLiteral("/Quorvane/Pelkan")).exists())
-        engine.addImportPath(buildModules);
+    // Run from a build tree, use its modules and catalogues rather than installed ones.
+    const QString buildTree = QCoreApplication::applicationDirPath() + QStringLiteral("/..");
+    QTranslator fallback;
+    QTranslator localised;
+    if (QDir(buildTree + QStringLiteral("/qml/Quorvane/Pelkan")).exists()) {
+        engine.addImportPath(buildTree + QStringLiteral("/qml"));
+        const QString catalogues = buildTree + QStringLiteral("/translations");
+        if (fallback.load(QStringLiteral("quorvanepelkan-qt5_eng_en"), catalogues))
+            QCoreApplication::installTranslator(&fallback);
+        if (localised.load(QLocale(), QStringLiteral("quorvanepelkan-qt5"), QStringLiteral("-"), catalogues))
+            QCoreApplication::installTranslator(&localised);
+    }
 
     engine.setInitialProperties({ { QStringLiteral("initialPage"), parser.value(page) } });
     engine.load(QUrl(QStringLiteral("qrc:/gallery/main.qml")));

@@ -1,7 +1,9 @@
 #include "moduleregistration.h"
 
 #include "coreregistration.h"
+#include "declarativeformatter.h"
 #include "declarativewindow.h"
+#include "formattingproxymodel.h"
 #include "palette.h"
 #include "screen.h"
 #include "theme.h"
@@ -52,6 +54,7 @@ void registerPublicModule(const char *uri)
     Pelkan::Private::registerTypes(uri);
     qmlRegisterRevision<QQuickItem, 1>(uri, 1, 0);
     registerSingleton<Pelkan::Theme>(uri, "Theme");
+    registerSingleton<DeclarativeFormatter>(uri, "Format");
     registerSingleton<Pelkan::Screen>(uri, "Screen");
     registerUncreatable<DeclarativePageStatus>(uri, "PageStatus");
     registerUncreatable<DeclarativePageNavigation>(uri, "PageNavigation");
@@ -66,7 +69,9 @@ void registerPublicModule(const char *uri)
     registerUncreatable<DeclarativePageStackAction>(uri, "PageStackAction");
     registerUncreatable<DeclarativeTabViewAction>(uri, "TabViewAction");
     registerUncreatable<DeclarativeDock>(uri, "Dock");
+    qmlRegisterType<DeclarativeFormatter>(uri, 1, 0, "Formatter");
     qmlRegisterAnonymousType<QAbstractItemModel>(uri, 1);
+    qmlRegisterType<FormattingProxyModel>(uri, 1, 0, "FormattingProxyModel");
     qmlRegisterType<Pelkan::Palette>(uri, 1, 0, "Palette");
     registerUncreatable<DeclarativeBusyIndicatorSize>(uri, "BusyIndicatorSize");
 }

@@ -481,15 +481,16 @@ void DeclarativeWindow::itemChange(ItemChange change, const ItemChangeData &data
 
 void DeclarativeWindow::enterWindow(QQuickWindow *window)
 {
+    // A window that is being destroyed has already let go of its content item.
+    const bool previousDestroyed = m_window && !m_window->contentItem();
     if (m_window) {
         disconnect(m_window, nullptr, this, nullptr);
         m_window->removeEventFilter(this);
     }
     m_window = window;
     if (!window) {
-        // An item without a parent is being torn down with its window or was detached on
-        // purpose; only a tree that lost its window is worth a warning.
-        if (parentItem())
+        // Torn down with its window, or detached on purpose: nothing worth a warning.
+        if (parentItem() && !previousDestroyed)
             qCWarning(lcPelkanCoreLog, "DeclarativeWindow::Item does not belong to a window");
         return;
     }

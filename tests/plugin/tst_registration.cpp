@@ -149,6 +149,8 @@ void tst_Registration::creatableTypes_data()
     QTest::newRow("ItemBase") << QByteArray("Private.ItemBase") << QByteArray("Pelkan::Item");
     QTest::newRow("ControlBase") << QByteArray("Private.ControlBase") << QByteArray("Pelkan::Control");
     QTest::newRow("Window") << QByteArray("Private.Window") << QByteArray("DeclarativeWindow");
+    QTest::newRow("Formatter") << QByteArray("Formatter") << QByteArray("DeclarativeFormatter");
+    QTest::newRow("FormattingProxyModel") << QByteArray("FormattingProxyModel") << QByteArray("FormattingProxyModel");
 }
 
 void tst_Registration::creatableTypes()
@@ -169,6 +171,7 @@ void tst_Registration::themeSingletonPerModule()
                                   "    property QtObject publicTheme: Theme\n"
                                   "    property QtObject themeModuleTheme: ThemeModule.Theme\n"
                                   "    property QtObject screenSingleton: Screen\n"
+                                  "    property string size: Format.formatFileSize(2048, 1)\n"
                                   "    property real margin: ThemeModule.Theme.horizontalPageMargin\n"
                                   "}\n", QUrl());
     QScopedPointer<QObject> object(component.create());
@@ -180,6 +183,7 @@ void tst_Registration::themeSingletonPerModule()
     QVERIFY(publicTheme != themeModuleTheme);
     QVERIFY(object->property("margin").toReal() > 0);
     QVERIFY(object->property("screenSingleton").value<QObject *>()->inherits("Pelkan::Screen"));
+    QVERIFY(!object->property("size").toString().isEmpty());
 }
 
 QTEST_MAIN(tst_Registration)

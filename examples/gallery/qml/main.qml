@@ -6,7 +6,7 @@ import Quorvane.Pelkan.private 1.0 as Private
 Window {
     id: window
 
-    // Which page the gallery opens on ("theme", "orientation").
+    // Which page the gallery opens on ("theme", "orientation", "format").
     property string initialPage: "theme"
 
     visible: true
@@ -27,9 +27,10 @@ Window {
             height: Theme.itemSizeSmall
 
             Repeater {
-                model: [{ name: "theme", title: "Theme" }, { name: "orientation", title: "Orientation" }]
+                model: [{ name: "theme", title: "Theme" }, { name: "orientation", title: "Orientation" },
+                        { name: "format", title: "Format" }]
                 Item {
-                    width: tabs.width / 2
+                    width: tabs.width / 3
                     height: tabs.height
                     Text {
                         anchors.centerIn: parent
@@ -47,7 +48,8 @@ Window {
 
         Loader {
             anchors { top: tabs.bottom; left: parent.left; right: parent.right; bottom: parent.bottom }
-            source: tabs.current === "orientation" ? "OrientationPage.qml" : "ThemePage.qml"
+            source: tabs.current === "orientation" ? "OrientationPage.qml"
+                  : tabs.current === "format" ? "FormatPage.qml" : "ThemePage.qml"
             onLoaded: if (item.hasOwnProperty("applicationWindow")) item.applicationWindow = applicationWindow
         }
     }
