@@ -34,9 +34,21 @@ QString translated(const QByteArray &id, int n = -1)
     return text.isEmpty() || text == QLatin1String(id) ? QString() : text;
 }
 
-// Fills the lowest placeholder when the text has one; an untranslated id has none.
+// Fills the lowest placeholder when the text has one; an untranslated id has none. A text
+// whose only '%' is the placeholder is spliced directly, which is what arg() would do.
 QString fill(const QString &text, const QString &value, int placeholder = 1)
 {
+    const QChar digit(ushort('0' + placeholder));
+    const int at = text.indexOf(QLatin1Char('%'));
+    if (at < 0)
+        return text;
+    if (at + 1 < text.size() && text.at(at + 1) == digit && text.indexOf(QLatin1Char('%'), at + 1) < 0
+            && (at + 2 >= text.size() || !text.at(at + 2).isDigit())) {
+        QString result;
+        result.reserve(text.size() + value.size() - 2);
+        result.append(text.constData(), at).append(value).append(text.constData() + at + 2, text.size() - at - 2);
+        return result;
+    }
     return text.contains(QLatin1Char('%') + QString::number(placeholder)) ? text.arg(value) : text;
 }
 
@@ -66,6 +78,53 @@ uint lastCodePoint(const QString &s)
     if (n > 1 && s.at(n - 1).isLowSurrogate() && s.at(n - 2).isHighSurrogate())
         return QChar::surrogateToUcs4(s.at(n - 2), s.at(n - 1));
     return s.at(n - 1).unicode();
+}
+
+// Writes a duration pattern in one pass: "h"/"hh" as the hour count (never wrapped),
+// "m", "mm", "s", "ss" as the minutes and seconds of the rest, anything else that is not a
+// letter or a quote as it stands. It gives exactly what replacing the hours and then
+// formatting the rest with the locale gives; unusual patterns (mixed or long hour runs,
+// other fields, quoted text, negative or four-digit hours) return false and take that path.
+bool formatDurationPattern(const QString &pattern, int hours, const QTime &rest, const QLocale &locale,
+                           QString *result)
+{
+    if (hours < 0 || hours > 999 || !rest.isValid())
+        return false;
+    const ushort fieldZero = locale.zeroDigit().unicode();
+    const ushort hourZero = QLocale().zeroDigit().unicode();
+    auto appendNumber = [result](int value, int width, ushort zero) {
+        if (value >= 100)
+            result->append(QChar(ushort(zero + value / 100)));
+        if (value >= 10 || width == 2)
+            result->append(QChar(ushort(zero + value / 10 % 10)));
+        result->append(QChar(ushort(zero + value % 10)));
+    };
+
+    int hourRun = 0;
+    result->clear();
+    result->reserve(pattern.size() + 2);
+    for (int i = 0; i < pattern.size(); ++i) {
+        const QChar c = pattern.at(i);
+        int run = 1;
+        while (i + run < pattern.size() && pattern.at(i + run) == c)
+            ++run;
+        if (c == QLatin1Char('h')) {
+            if (run > 2 || (hourRun && hourRun != run))
+                return false;
+            hourRun = run;
+            appendNumber(hours, run, hourZero);
+        } else if (c == QLatin1Char('m') || c == QLatin1Char('s')) {
+            if (run > 2)
+                return false;
+            appendNumber(c == QLatin1Char('m') ? rest.minute() : rest.second(), run, fieldZero);
+        } else if (c.isLetter() || c == QLatin1Char('\'') || c == QLatin1Char('%')) {
+            return false;
+        } else {
+            result->append(pattern.constData() + i, run);
+        }
+        i += run - 1;
+    }
+    return true;
 }
 
 } // namespace
@@ -168,35 +227,38 @@ QString DeclarativeFormatter::datePattern(const QDate &date, const char *id, boo
     return s_formattingLocale.toString(date, pattern);
 }
 
-QString DeclarativeFormatter::elapsed(const QDateTime &dateTime, bool shortForm) const
+QString DeclarativeFormatter::elapsed(const QDateTime &dateTime, const QDate &today, bool shortForm) const
 {
-    const QDateTime now = FormatterSeams::currentDateTime();
-    const qint64 minutes = dateTime.secsTo(now) / 60;
+    // As dateTime.secsTo(now), without building a local date-time for now.
+    const qint64 seconds = (FormatterSeams::currentMSecsSinceEpoch() - dateTime.toMSecsSinceEpoch()) / 1000;
+    const qint64 minutes = seconds / 60;
     const bool future = minutes < 0;
     const qint64 m = qAbs(minutes);
 
-    auto text = [&](const char *base, qint64 n) {
-        QByteArray id(base);
-        if (future)
-            id += "-future";
-        if (shortForm)
-            id += "-short";
-        return qtTrId(id.constData(), int(n));
+    // Rows: minutes, hours, days, months; columns: past, past short, future, future short.
+    static const char *const ids[4][4] = {
+        { "quorvanepelkan-minutes", "quorvanepelkan-minutes-short", "quorvanepelkan-minutes-future", "quorvanepelkan-minutes-future-short" },
+        { "quorvanepelkan-hours", "quorvanepelkan-hours-short", "quorvanepelkan-hours-future", "quorvanepelkan-hours-future-short" },
+        { "quorvanepelkan-days", "quorvanepelkan-days-short", "quorvanepelkan-days-future", "quorvanepelkan-days-future-short" },
+        { "quorvanepelkan-months", "quorvanepelkan-months-short", "quorvanepelkan-months-future", "quorvanepelkan-months-future-short" },
+    };
+    enum Unit { Minutes, Hours, Days, Months };
+    auto text = [&](Unit unit, qint64 n) {
+        return qtTrId(ids[unit][(future ? 2 : 0) + (shortForm ? 1 : 0)], int(n));
     };
 
     if (m == 0)
         return qtTrId("quorvanepelkan-now");
     if (m < 60)
-        return text("quorvanepelkan-minutes", m);
+        return text(Minutes, m);
     const qint64 h = m / 60;
     if (h < 24)
-        return text("quorvanepelkan-hours", h);
+        return text(Hours, h);
 
-    const QDate today = now.date();
     const QDate date = dateTime.date();
     const qint64 d = qAbs(today.toJulianDay() - date.toJulianDay());
     if (d < 28)
-        return text("quorvanepelkan-days", d);
+        return text(Days, d);
     if (!date.isValid())
         return QString();
 
@@ -217,7 +279,7 @@ QString DeclarativeFormatter::elapsed(const QDateTime &dateTime, bool shortForm)
         from = from.addMonths(1);
         ++months;
     }
-    return months == 0 ? text("quorvanepelkan-days", d) : text("quorvanepelkan-months", months);
+    return months == 0 ? text(Days, d) : text(Months, months);
 }
 
 // Operations ---------------------------------------------------------------------------
@@ -232,7 +294,7 @@ QString DeclarativeFormatter::formatDate(const QDateTime &dateTime, int formatTy
     }
 
     const QDate date = dateTime.date();
-    const QDate today = FormatterSeams::currentDateTime().date();
+    const QDate today = FormatterSeams::currentDate();
     const qint64 difference = today.toJulianDay() - date.toJulianDay();
 
     switch (FormatType(formatType)) {
@@ -266,9 +328,9 @@ QString DeclarativeFormatter::formatDate(const QDateTime &dateTime, int formatTy
     case WeekdayNameStandalone:
         return weekdayName(date, false);
     case DurationElapsed:
-        return elapsed(dateTime, false);
+        return elapsed(dateTime, today, false);
     case DurationElapsedShort:
-        return elapsed(dateTime, true);
+        return elapsed(dateTime, today, true);
     case TimeValueTwelveHours:
         return timeValue(dateTime.time(), true);
     case TimeValueTwentyFourHours:
@@ -325,6 +387,10 @@ QString DeclarativeFormatter::formatDuration(int seconds, int formatType) const
     QString pattern = translated(shortForm ? "quorvanepelkan-duration_short_format" : "quorvanepelkan-duration_long_format");
     if (pattern.isEmpty())
         pattern = shortForm ? QStringLiteral("m:ss") : QStringLiteral("h:mm:ss");
+
+    QString text;
+    if (formatDurationPattern(pattern, hours, QTime(0, 0).addSecs(rest), s_formattingLocale, &text))
+        return text;
 
     // Hours go in as a number so that they never wrap at 24.
     if (pattern.contains(QLatin1String("hh"))) {

@@ -72,7 +72,7 @@ private:
     QString yearOrShortDate(const QDate &date, const QDate &today) const;
     QString sectionRelative(qint64 difference, const QDate &date) const;
     QString timepoint(const QString &time, const QString &dateOrDay) const;
-    QString elapsed(const QDateTime &dateTime, bool shortForm) const;
+    QString elapsed(const QDateTime &dateTime, const QDate &today, bool shortForm) const;
     QString timeValue(const QTime &time, bool twelveHours) const;
     QString datePattern(const QDate &date, const char *id, bool replaceWeekday) const;
 

@@ -7,9 +7,14 @@ QString s_translationsDirectory;
 
 namespace FormatterSeams {
 
-QDateTime currentDateTime()
+qint64 currentMSecsSinceEpoch()
 {
-    return s_fixedNow.isValid() ? s_fixedNow : QDateTime::currentDateTime();
+    return s_fixedNow.isValid() ? s_fixedNow.toMSecsSinceEpoch() : QDateTime::currentMSecsSinceEpoch();
+}
+
+QDate currentDate()
+{
+    return s_fixedNow.isValid() ? s_fixedNow.date() : QDate::currentDate();
 }
 
 QString translationsDirectory()

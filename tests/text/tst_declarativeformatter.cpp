@@ -31,6 +31,7 @@ private Q_SLOTS:
     void formatFileSize();
     void formatDuration_data();
     void formatDuration();
+    void durationSweepMatchesLocale();
     void formatText_data();
     void formatText();
     void joinNames_data();
@@ -237,6 +238,7 @@ void tst_DeclarativeFormatter::formatDuration_data()
     QTest::newRow("3 700 short") << 3700 << int(F::DurationShort) << "1:40";
     QTest::newRow("90 000 long, hours not wrapped") << 90000 << int(F::DurationLong) << "25:00:00";
     QTest::newRow("59 long") << 59 << int(F::DurationLong) << "0:00:59";
+    QTest::newRow("1000 hours, grouped") << 3600000 << int(F::DurationLong) << "1,000:00:00";
     QTest::newRow("other type is long") << 61 << int(F::DateFull) << "0:01:01";
 }
 
@@ -249,6 +251,19 @@ void tst_DeclarativeFormatter::formatDuration()
     // The built-in patterns are the catalogue's.
     useCatalogue(false);
     QCOMPARE(F().formatDuration(seconds, type), expected);
+}
+
+void tst_DeclarativeFormatter::durationSweepMatchesLocale()
+{
+    // Every minute and second field, padded or not, as the locale's time formatter writes it.
+    F formatter;
+    const QLocale locale;
+    for (int seconds = 0; seconds < 3 * 3600; seconds += 37) {
+        const QTime rest = QTime(0, 0).addSecs(seconds % 3600);
+        QCOMPARE(formatter.formatDuration(seconds, F::DurationLong),
+                 QString::number(seconds / 3600) + QLatin1Char(':') + locale.toString(rest, QStringLiteral("mm:ss")));
+        QCOMPARE(formatter.formatDuration(seconds, F::DurationShort), locale.toString(rest, QStringLiteral("m:ss")));
+    }
 }
 
 void tst_DeclarativeFormatter::formatText_data()
