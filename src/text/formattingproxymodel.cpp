@@ -30,10 +30,10 @@ FormattingProxyModel::FormattingProxyModel(QObject *parent)
 
 void FormattingProxyModel::setFormats(const QVariantList &formats)
 {
-    if (formats == m_formatSpecs)
+    if (formats == m_formatEntries)
         return;
     beginResetModel();
-    m_formatSpecs = formats;
+    m_formatEntries = formats;
     parseFormats();
     resolveRoles();
     endResetModel();
@@ -43,8 +43,8 @@ void FormattingProxyModel::setFormats(const QVariantList &formats)
 void FormattingProxyModel::parseFormats()
 {
     m_formats.clear();
-    for (const QVariant &spec : qAsConst(m_formatSpecs)) {
-        const QVariantMap map = spec.toMap();
+    for (const QVariant &entry : qAsConst(m_formatEntries)) {
+        const QVariantMap map = entry.toMap();
         Format format;
         format.name = map.value(QStringLiteral("role")).toString().toUtf8();
         format.sourceName = map.value(QStringLiteral("source")).toString().toUtf8();

@@ -34,7 +34,7 @@ class FormattingProxyModel : public QIdentityProxyModel
 public:
     explicit FormattingProxyModel(QObject *parent = nullptr);
 
-    QVariantList formats() const { return m_formatSpecs; }
+    QVariantList formats() const { return m_formatEntries; }
     void setFormats(const QVariantList &formats);
 
     void setSourceModel(QAbstractItemModel *model) override;
@@ -65,7 +65,7 @@ private:
     int sourceRoleOf(const Format &format) const;
 
     DeclarativeFormatter m_formatter;
-    QVariantList m_formatSpecs;
+    QVariantList m_formatEntries;
     QVector<Format> m_formats;
     QMetaObject::Connection m_sourceConnection;
 };
