@@ -1,9 +1,12 @@
 #include "moduleregistration.h"
 
 #include "coreregistration.h"
+#include "declarativebounceeffect.h"
 #include "declarativeformatter.h"
+#include "declarativepagestackbase.h"
 #include "declarativewindow.h"
 #include "formattingproxymodel.h"
+#include "pulleymenulogic.h"
 #include "palette.h"
 #include "screen.h"
 #include "theme.h"
@@ -69,6 +72,8 @@ void registerPublicModule(const char *uri)
     registerUncreatable<DeclarativePageStackAction>(uri, "PageStackAction");
     registerUncreatable<DeclarativeTabViewAction>(uri, "TabViewAction");
     registerUncreatable<DeclarativeDock>(uri, "Dock");
+    qmlRegisterType<DeclarativePageStackBase>(uri, 1, 0, "PageStackBase");
+    qmlRegisterType<DeclarativeBounceEffect>(uri, 1, 0, "BounceEffect");
     qmlRegisterType<DeclarativeFormatter>(uri, 1, 0, "Formatter");
     qmlRegisterAnonymousType<QAbstractItemModel>(uri, 1);
     qmlRegisterType<FormattingProxyModel>(uri, 1, 0, "FormattingProxyModel");
@@ -82,6 +87,7 @@ void registerPrivateModule(const char *uri)
     qmlRegisterRevision<QQuickItem, 1>(uri, 1, 0);
     qmlRegisterRevision<QQuickWindow, 1>(uri, 1, 0);
     qmlRegisterType<DeclarativeWindow>(uri, 1, 0, "Window");
+    qmlRegisterType<PulleyMenuLogic>(uri, 1, 0, "PulleyMenuLogic");
     registerUncreatable<TimePickerMode>(uri, "TimePickerMode");
 }
 

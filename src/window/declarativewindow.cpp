@@ -616,4 +616,29 @@ void DeclarativeWindow::dispatch(QEvent *event)
         observer->windowEvent(event);
         event->setAccepted(accepted);
     }
+
+    // Qt Quick turns touches into mouse events only inside its item delivery, where the
+    // window never sees them; observers written for the mouse get the same here.
+    QEvent::Type mouseType = QEvent::None;
+    switch (event->type()) {
+    case QEvent::TouchBegin:
+        mouseType = QEvent::MouseButtonPress;
+        break;
+    case QEvent::TouchUpdate:
+        mouseType = QEvent::MouseMove;
+        break;
+    case QEvent::TouchEnd:
+        mouseType = QEvent::MouseButtonRelease;
+        break;
+    default:
+        return;
+    }
+    const QList<QTouchEvent::TouchPoint> points = static_cast<QTouchEvent *>(event)->touchPoints();
+    if (points.isEmpty())
+        return;
+    const QTouchEvent::TouchPoint &primary = points.first();
+    const Qt::MouseButtons buttons = mouseType == QEvent::MouseButtonRelease ? Qt::NoButton : Qt::LeftButton;
+    QMouseEvent mouse(mouseType, primary.pos(), primary.pos(), primary.screenPos(), Qt::LeftButton, buttons,
+                      Qt::NoModifier, Qt::MouseEventSynthesizedByQt);
+    dispatch(&mouse);
 }

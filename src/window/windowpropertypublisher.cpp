@@ -21,10 +21,11 @@ TestRoute &testRoute()
 
 bool WindowPropertyPublisher::isWayland()
 {
-    const QString platform = testRoute().sink && !testRoute().platformName.isEmpty()
-            ? testRoute().platformName
-            : QGuiApplication::platformName();
-    return platform == QLatin1String("wayland");
+    if (testRoute().sink && !testRoute().platformName.isEmpty())
+        return testRoute().platformName == QLatin1String("wayland");
+    // The platform of a process never changes.
+    static const bool wayland = QGuiApplication::platformName() == QLatin1String("wayland");
+    return wayland;
 }
 
 bool WindowPropertyPublisher::canPublish(const QWindow *window)
