@@ -64,10 +64,11 @@ void DeclarativeBounceEffect::setFlickable(QQuickItem *flickable)
     if (flickable) {
         connect(flickable, &QQuickItem::visibleChanged, this, &DeclarativeBounceEffect::activeFlickableChanged);
         connect(flickable, &QQuickItem::enabledChanged, this, &DeclarativeBounceEffect::activeFlickableChanged);
+        // Flickable is Qt's private class: its interactive signal is reached by name.
         const int interactive = flickable->metaObject()->indexOfSignal("interactiveChanged()");
         if (interactive >= 0) {
             connect(flickable, flickable->metaObject()->method(interactive), this,
-                    metaObject()->method(metaObject()->indexOfMethod("activeFlickableChanged()")));
+                    metaObject()->method(metaObject()->indexOfSlot("flickableStateChanged()")));
         }
         activeFlickableChanged();
     }

@@ -46,6 +46,9 @@ Q_SIGNALS:
     void activeChanged();
     void flickableChanged();
 
+private Q_SLOTS:
+    void flickableStateChanged() { activeFlickableChanged(); }
+
 private:
     enum Direction { Horizontal = 1, Vertical = 2 };
     int directions() const;

@@ -95,9 +95,9 @@ void DeclarativePageStackBase::setNoGrabbing(bool noGrabbing)
 
 void DeclarativePageStackBase::mousePressEvent(QMouseEvent *event)
 {
+    // A press is never taken: the page's content gets it, and the swipe is stolen later.
     handleMouse(event);
-    // Take the press on an empty part of the page so that the swipe's moves come here.
-    event->setAccepted(m_pressed);
+    event->ignore();
 }
 
 void DeclarativePageStackBase::mouseMoveEvent(QMouseEvent *event)
