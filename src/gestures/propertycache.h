@@ -6,7 +6,8 @@ class QObject;
 
 // Reads and writes QML properties by name, with each (type, name) index looked up once
 // for the life of the process. Objects of the same QML type share one entry; a missing
-// property reads as an invalid QVariant. GUI thread only.
+// property reads as an invalid QVariant. Names must be string literals (their address is
+// part of the key). GUI thread only.
 namespace PropertyCache {
 
 QVariant read(const QObject *object, const char *name);

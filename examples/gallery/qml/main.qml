@@ -6,7 +6,7 @@ import Quorvane.Pelkan.private 1.0 as Private
 Window {
     id: window
 
-    // Which page the gallery opens on ("theme", "orientation", "format").
+    // Which page the gallery opens on ("theme", "orientation", "format", "gestures").
     property string initialPage: "theme"
 
     visible: true
@@ -28,9 +28,9 @@ Window {
 
             Repeater {
                 model: [{ name: "theme", title: "Theme" }, { name: "orientation", title: "Orientation" },
-                        { name: "format", title: "Format" }]
+                        { name: "format", title: "Format" }, { name: "gestures", title: "Gestures" }]
                 Item {
-                    width: tabs.width / 3
+                    width: tabs.width / 4
                     height: tabs.height
                     Text {
                         anchors.centerIn: parent
@@ -49,7 +49,8 @@ Window {
         Loader {
             anchors { top: tabs.bottom; left: parent.left; right: parent.right; bottom: parent.bottom }
             source: tabs.current === "orientation" ? "OrientationPage.qml"
-                  : tabs.current === "format" ? "FormatPage.qml" : "ThemePage.qml"
+                  : tabs.current === "format" ? "FormatPage.qml"
+                  : tabs.current === "gestures" ? "GesturesPage.qml" : "ThemePage.qml"
             onLoaded: if (item.hasOwnProperty("applicationWindow")) item.applicationWindow = applicationWindow
         }
     }
