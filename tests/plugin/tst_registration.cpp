@@ -150,6 +150,9 @@ void tst_Registration::creatableTypes_data()
     QTest::newRow("ControlBase") << QByteArray("Private.ControlBase") << QByteArray("Pelkan::Control");
     QTest::newRow("Window") << QByteArray("Private.Window") << QByteArray("DeclarativeWindow");
     QTest::newRow("Formatter") << QByteArray("Formatter") << QByteArray("DeclarativeFormatter");
+    QTest::newRow("PageStackBase") << QByteArray("PageStackBase") << QByteArray("DeclarativePageStackBase");
+    QTest::newRow("BounceEffect") << QByteArray("BounceEffect") << QByteArray("DeclarativeBounceEffect");
+    QTest::newRow("PulleyMenuLogic") << QByteArray("Private.PulleyMenuLogic") << QByteArray("PulleyMenuLogic");
     QTest::newRow("FormattingProxyModel") << QByteArray("FormattingProxyModel") << QByteArray("FormattingProxyModel");
 }
 
