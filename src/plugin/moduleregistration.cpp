@@ -2,6 +2,10 @@
 
 #include "coreregistration.h"
 #include "declarativebounceeffect.h"
+#include "declarativecover.h"
+#include "declarativecoveraction.h"
+#include "declarativecoveractionlist.h"
+#include "declarativecoverwindow.h"
 #include "declarativeformatter.h"
 #include "declarativepagestackbase.h"
 #include "declarativewindow.h"
@@ -74,7 +78,10 @@ void registerPublicModule(const char *uri)
     registerUncreatable<DeclarativeDock>(uri, "Dock");
     qmlRegisterType<DeclarativePageStackBase>(uri, 1, 0, "PageStackBase");
     qmlRegisterType<DeclarativeBounceEffect>(uri, 1, 0, "BounceEffect");
+    qmlRegisterType<DeclarativeCoverAction>(uri, 1, 0, "CoverAction");
+    qmlRegisterType<DeclarativeCoverActionList>(uri, 1, 0, "CoverActionList");
     qmlRegisterType<DeclarativeFormatter>(uri, 1, 0, "Formatter");
+    qmlRegisterType<DeclarativeCover>(uri, 1, 0, "Cover");
     qmlRegisterAnonymousType<QAbstractItemModel>(uri, 1);
     qmlRegisterType<FormattingProxyModel>(uri, 1, 0, "FormattingProxyModel");
     qmlRegisterType<Pelkan::Palette>(uri, 1, 0, "Palette");
@@ -87,6 +94,7 @@ void registerPrivateModule(const char *uri)
     qmlRegisterRevision<QQuickItem, 1>(uri, 1, 0);
     qmlRegisterRevision<QQuickWindow, 1>(uri, 1, 0);
     qmlRegisterType<DeclarativeWindow>(uri, 1, 0, "Window");
+    qmlRegisterType<DeclarativeCoverWindow>(uri, 1, 0, "CoverWindow");
     qmlRegisterType<PulleyMenuLogic>(uri, 1, 0, "PulleyMenuLogic");
     registerUncreatable<TimePickerMode>(uri, "TimePickerMode");
 }

@@ -432,8 +432,12 @@ void DeclarativeWindow::_setCover(QObject *window)
     if (m_coverWindow)
         disconnect(m_coverWindow, &QObject::destroyed, this, &DeclarativeWindow::coverWindowDestroyed);
     m_coverWindow = cover;
-    if (cover)
+    if (cover) {
         connect(cover, &QObject::destroyed, this, &DeclarativeWindow::coverWindowDestroyed);
+        // A cover window pairs itself with the application window it belongs to.
+        if (cover->metaObject()->indexOfProperty("mainWindow") >= 0)
+            cover->setProperty("mainWindow", QVariant::fromValue<QObject *>(this));
+    }
 
     WindowPropertyPublisher::setRetainCover(publicationTarget(), cover != nullptr);
     publishWindowProperties();

@@ -1,6 +1,8 @@
 #include "windowpropertypublisher.h"
 
 #include <QGuiApplication>
+#include <QHash>
+#include <QPair>
 #include <QWindow>
 #include <qpa/qplatformnativeinterface.h>
 
@@ -9,6 +11,7 @@ namespace {
 struct TestRoute {
     WindowPropertyPublisher::Sink sink;
     QString platformName;
+    QHash<QPair<const QWindow *, QString>, QVariant> written;
 };
 
 TestRoute &testRoute()
@@ -38,11 +41,22 @@ void WindowPropertyPublisher::setProperty(QWindow *window, const QString &name, 
     if (!canPublish(window))
         return;
     if (testRoute().sink) {
+        testRoute().written.insert(qMakePair(static_cast<const QWindow *>(window), name), value);
         testRoute().sink(window, name, value);
         return;
     }
     if (QPlatformNativeInterface *native = QGuiApplication::platformNativeInterface())
         native->setWindowProperty(window->handle(), name, value);
+}
+
+QVariant WindowPropertyPublisher::property(QWindow *window, const QString &name)
+{
+    if (!canPublish(window))
+        return QVariant();
+    if (testRoute().sink)
+        return testRoute().written.value(qMakePair(static_cast<const QWindow *>(window), name));
+    QPlatformNativeInterface *native = QGuiApplication::platformNativeInterface();
+    return native ? native->windowProperty(window->handle(), name) : QVariant();
 }
 
 void WindowPropertyPublisher::setRetainCover(QWindow *window, bool retain)
@@ -54,4 +68,5 @@ void WindowPropertyPublisher::setSinkForTesting(const Sink &sink, const QString 
 {
     testRoute().sink = sink;
     testRoute().platformName = platformName;
+    testRoute().written.clear();
 }
