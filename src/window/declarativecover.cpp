@@ -22,6 +22,8 @@ DeclarativeCover::DeclarativeCover(QQuickItem *parent)
                                           this, SLOT(setStatus(int)));
     const QSize large = Pelkan::Theme::instance()->coverSizeLarge();
     setImplicitSize(large.width(), large.height());
+    // A parent given at construction put the item in its window before itemChange() ran.
+    applicationWindowChanged();
 }
 
 QQuickItem *DeclarativeCover::coverActionArea() const

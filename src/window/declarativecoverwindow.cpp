@@ -23,6 +23,16 @@ DeclarativeCoverWindow::DeclarativeCoverWindow(QWindow *parent)
     }
 }
 
+DeclarativeCoverWindow::~DeclarativeCoverWindow()
+{
+    // The base class deletes the content item, and the cover with it, after this part of
+    // the window is gone: its notifications must not reach us then.
+    if (m_cover)
+        disconnect(m_cover, nullptr, this, nullptr);
+    if (m_mainWindow)
+        disconnect(m_mainWindow, nullptr, this, nullptr);
+}
+
 DeclarativeCover *DeclarativeCoverWindow::cover() const
 {
     return m_cover;

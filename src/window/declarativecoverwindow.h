@@ -17,6 +17,7 @@ class DeclarativeCoverWindow : public QQuickWindow
 
 public:
     explicit DeclarativeCoverWindow(QWindow *parent = nullptr);
+    ~DeclarativeCoverWindow() override;
 
     DeclarativeCover *cover() const;
     void setCover(DeclarativeCover *cover);

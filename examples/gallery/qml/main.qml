@@ -6,7 +6,7 @@ import Quorvane.Pelkan.private 1.0 as Private
 Window {
     id: window
 
-    // Which page the gallery opens on ("theme", "orientation", "format", "gestures").
+    // Which page the gallery opens on ("theme", "orientation", "format", "gestures", "cover").
     property string initialPage: "theme"
 
     visible: true
@@ -28,15 +28,16 @@ Window {
 
             Repeater {
                 model: [{ name: "theme", title: "Theme" }, { name: "orientation", title: "Orientation" },
-                        { name: "format", title: "Format" }, { name: "gestures", title: "Gestures" }]
+                        { name: "format", title: "Format" }, { name: "gestures", title: "Gestures" },
+                        { name: "cover", title: "Cover" }]
                 Item {
-                    width: tabs.width / 4
+                    width: tabs.width / 5
                     height: tabs.height
                     Text {
                         anchors.centerIn: parent
                         text: modelData.title
                         color: tabs.current === modelData.name ? Theme.highlightColor : Theme.secondaryColor
-                        font.pixelSize: Theme.fontSizeMedium
+                        font.pixelSize: Theme.fontSizeSmall
                     }
                     MouseArea {
                         anchors.fill: parent
@@ -50,7 +51,8 @@ Window {
             anchors { top: tabs.bottom; left: parent.left; right: parent.right; bottom: parent.bottom }
             source: tabs.current === "orientation" ? "OrientationPage.qml"
                   : tabs.current === "format" ? "FormatPage.qml"
-                  : tabs.current === "gestures" ? "GesturesPage.qml" : "ThemePage.qml"
+                  : tabs.current === "gestures" ? "GesturesPage.qml"
+                  : tabs.current === "cover" ? "CoverPage.qml" : "ThemePage.qml"
             onLoaded: if (item.hasOwnProperty("applicationWindow")) item.applicationWindow = applicationWindow
         }
     }

@@ -1,0 +1,280 @@
+#include "declarativecoveraction.h"
+#include "declarativecoveractionlist.h"
+#include "windowpropertypublisher.h"
+
+#include <QDBusConnection>
+#include <QDBusConnectionInterface>
+#include <QDBusMessage>
+#include <QProcess>
+#include <QQuickWindow>
+#include <QTemporaryDir>
+#include <QtTest>
+
+#include <grp.h>
+#include <unistd.h>
+
+// A private bus that, unlike an ordinary session bus, admits every user: the caller check
+// is tested against a second process running under another uid.
+static const char BusConfig[] =
+        "<!DOCTYPE busconfig PUBLIC \"-//freedesktop//DTD D-Bus Bus Configuration 1.0//EN\"\n"
+        " \"http://www.freedesktop.org/standards/dbus/1.0/busconfig.dtd\">\n"
+        "<busconfig>\n"
+        "  <type>session</type>\n"
+        "  <listen>unix:path=%1</listen>\n"
+        "  <auth>EXTERNAL</auth>\n"
+        "  <policy context=\"default\">\n"
+        "    <allow user=\"*\"/>\n"
+        "    <allow send_destination=\"*\" eavesdrop=\"true\"/>\n"
+        "    <allow eavesdrop=\"true\"/>\n"
+        "    <allow own=\"*\"/>\n"
+        "  </policy>\n"
+        "</busconfig>\n";
+
+class tst_DeclarativeCoverActionList : public QObject
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void initTestCase();
+    void cleanupTestCase();
+    void cleanup() { WindowPropertyPublisher::setSinkForTesting({}); }
+
+    void listsGetNumberedNamesOnTheBus();
+    void triggerFromPrivilegedCaller_data();
+    void triggerFromPrivilegedCaller();
+    void triggerFromAnotherUser_data();
+    void triggerFromAnotherUser();
+    void payload_data();
+    void payload();
+    void removeEntries_data();
+    void removeEntries();
+    void changesArePublishedTogether();
+
+private:
+    DeclarativeCoverActionList *makeList(int actions);
+
+    QTemporaryDir m_busDir;
+    QProcess m_bus;
+    QString m_address;
+    QObjectList m_made;
+};
+
+void tst_DeclarativeCoverActionList::initTestCase()
+{
+    QVERIFY(m_busDir.isValid());
+    QFile::setPermissions(m_busDir.path(), QFileDevice::ReadOwner | QFileDevice::WriteOwner | QFileDevice::ExeOwner
+                                                  | QFileDevice::ReadOther | QFileDevice::ExeOther
+                                                  | QFileDevice::ReadGroup | QFileDevice::ExeGroup);
+    const QString socket = m_busDir.filePath(QStringLiteral("bus"));
+    QFile config(m_busDir.filePath(QStringLiteral("bus.conf")));
+    QVERIFY(config.open(QIODevice::WriteOnly));
+    config.write(QString::fromLatin1(BusConfig).arg(socket).toUtf8());
+    config.close();
+
+    m_bus.start(QStringLiteral("dbus-daemon"), { QStringLiteral("--config-file=") + config.fileName(),
+                                                 QStringLiteral("--nofork"), QStringLiteral("--print-address") });
+    QVERIFY(m_bus.waitForStarted());
+    QTRY_VERIFY(m_bus.canReadLine());
+    m_address = QString::fromUtf8(m_bus.readLine()).trimmed();
+    // Before the first use of the session bus in this process.
+    qputenv("DBUS_SESSION_BUS_ADDRESS", m_address.toUtf8());
+    QVERIFY(QDBusConnection::sessionBus().isConnected());
+}
+
+void tst_DeclarativeCoverActionList::cleanupTestCase()
+{
+    qDeleteAll(m_made);
+    m_bus.terminate();
+    m_bus.waitForFinished();
+}
+
+DeclarativeCoverActionList *tst_DeclarativeCoverActionList::makeList(int actions)
+{
+    auto list = new DeclarativeCoverActionList;
+    m_made << list;
+    for (int i = 0; i < actions; ++i) {
+        auto action = new DeclarativeCoverAction(list);
+        action->setIconSource(QUrl(QStringLiteral("image://theme/icon-cover-%1").arg(i)));
+        list->appendAction(action);
+    }
+    list->componentComplete();
+    return list;
+}
+
+void tst_DeclarativeCoverActionList::listsGetNumberedNamesOnTheBus()
+{
+    DeclarativeCoverActionList *first = makeList(1);
+    DeclarativeCoverActionList *second = makeList(1);
+    const QString pid = QString::number(QCoreApplication::applicationPid());
+    QCOMPARE(first->serviceName(), QStringLiteral("org.quorvaneos.coveraction.pid%1.id1").arg(pid));
+    QCOMPARE(second->serviceName(), QStringLiteral("org.quorvaneos.coveraction.pid%1.id2").arg(pid));
+    QCOMPARE(second->objectPath(), QStringLiteral("/org/quorvaneos/coveraction/pid%1/id2").arg(pid));
+    QVERIFY(first->isRegistered() && second->isRegistered());
+    QDBusConnectionInterface *bus = QDBusConnection::sessionBus().interface();
+    QVERIFY(bus->isServiceRegistered(first->serviceName()));
+    QVERIFY(bus->isServiceRegistered(second->serviceName()));
+}
+
+void tst_DeclarativeCoverActionList::triggerFromPrivilegedCaller_data()
+{
+    QTest::addColumn<int>("index");
+    QTest::addColumn<int>("triggered"); // which action fires, -1 for none
+    QTest::newRow("first") << 0 << 0;
+    QTest::newRow("third") << 2 << 2;
+    QTest::newRow("past the end") << 3 << -1;
+    QTest::newRow("negative") << -1 << -1;
+}
+
+void tst_DeclarativeCoverActionList::triggerFromPrivilegedCaller()
+{
+    if (::getuid() != 0)
+        QSKIP("the caller check accepts root; this test runs as root in CI");
+    QFETCH(int, index);
+    QFETCH(int, triggered);
+    DeclarativeCoverActionList *list = makeList(3);
+    QList<QSharedPointer<QSignalSpy>> spies;
+    for (DeclarativeCoverAction *action : list->actionList())
+        spies << QSharedPointer<QSignalSpy>::create(action, &DeclarativeCoverAction::triggered);
+
+    // A connection of its own, as the home screen would have.
+    QDBusConnection caller = QDBusConnection::connectToBus(m_address, QStringLiteral("caller"));
+    QVERIFY(caller.isConnected());
+    if (triggered < 0)
+        QTest::ignoreMessage(QtWarningMsg, QRegularExpression(QStringLiteral("^CoverActionList: no action at index")));
+    QDBusMessage call = QDBusMessage::createMethodCall(list->serviceName(), list->objectPath(),
+                                                      QStringLiteral("org.quorvaneos.pelkan.coveraction"),
+                                                      QStringLiteral("trigger"));
+    call << index;
+    QDBusPendingCall pending = caller.asyncCall(call);
+    QTRY_VERIFY(pending.isFinished());
+    QVERIFY2(!pending.isError(), qPrintable(pending.error().message()));
+    for (int i = 0; i < spies.size(); ++i)
+        QCOMPARE(spies.at(i)->count(), i == triggered ? 1 : 0);
+    QDBusConnection::disconnectFromBus(QStringLiteral("caller"));
+}
+
+void tst_DeclarativeCoverActionList::triggerFromAnotherUser_data()
+{
+    QTest::addColumn<QString>("group");
+    QTest::addColumn<bool>("accepted");
+    QTest::newRow("nobody") << "nogroup" << false;
+    QTest::newRow("nobody in privileged") << "privileged" << true;
+}
+
+void tst_DeclarativeCoverActionList::triggerFromAnotherUser()
+{
+    QFETCH(QString, group);
+    QFETCH(bool, accepted);
+    if (::getuid() != 0)
+        QSKIP("running a caller under another uid needs root");
+    if (group == QLatin1String("privileged") && QProcess::execute(QStringLiteral("groupadd"), { QStringLiteral("-f"), group }) != 0)
+        QSKIP("cannot create the group privileged here");
+    const struct group *entry = ::getgrnam(group.toUtf8().constData());
+    QVERIFY(entry);
+
+    DeclarativeCoverActionList *list = makeList(1);
+    QSignalSpy triggered(list->actionList().first(), &DeclarativeCoverAction::triggered);
+    QProcess caller;
+    caller.start(QStringLiteral("setpriv"), {
+            QStringLiteral("--reuid=65534"), QStringLiteral("--regid=%1").arg(entry->gr_gid), QStringLiteral("--clear-groups"),
+            QStringLiteral("dbus-send"), QStringLiteral("--bus=") + m_address, QStringLiteral("--print-reply"),
+            QStringLiteral("--dest=") + list->serviceName(), list->objectPath(),
+            QStringLiteral("org.quorvaneos.pelkan.coveraction.trigger"), QStringLiteral("int32:0") });
+    QVERIFY(caller.waitForStarted());
+    QTRY_COMPARE_WITH_TIMEOUT(caller.state(), QProcess::NotRunning, 10000);
+    const QString errors = QString::fromUtf8(caller.readAllStandardError());
+    if (accepted) {
+        QCOMPARE(caller.exitCode(), 0);
+        QCOMPARE(triggered.count(), 1);
+    } else {
+        QVERIFY(caller.exitCode() != 0);
+        QVERIFY2(errors.contains(QLatin1String("org.freedesktop.DBus.Error.AccessDenied")), qPrintable(errors));
+        QVERIFY2(errors.contains(QRegularExpression(QStringLiteral("PID \\d+ is not in privileged group"))), qPrintable(errors));
+        QCOMPARE(triggered.count(), 0);
+    }
+}
+
+void tst_DeclarativeCoverActionList::payload_data()
+{
+    QTest::addColumn<quint64>("windowId");
+    QTest::addColumn<bool>("enabled");
+    QTest::addColumn<int>("actions");
+    QTest::addColumn<bool>("iconBackground");
+    QTest::addColumn<QString>("expected");
+    const QString n = QStringLiteral("org.quorvaneos.coveraction.pid7.id1");
+    QTest::newRow("no actions") << quint64(5) << true << 0 << false << "";
+    QTest::newRow("one action") << quint64(5) << true << 1 << false << n + "\ntrigger\n0\nimage://theme/icon-0\n0";
+    QTest::newRow("two actions") << quint64(5) << true << 2 << true
+                                 << n + "\ntrigger\n0\nimage://theme/icon-0\n" + n + "\ntrigger\n1\nimage://theme/icon-1\n1";
+    QTest::newRow("disabled") << quint64(5) << false << 2 << true << "";
+    QTest::newRow("no window id") << quint64(0) << true << 2 << true << "";
+}
+
+void tst_DeclarativeCoverActionList::payload()
+{
+    QFETCH(quint64, windowId);
+    QFETCH(bool, enabled);
+    QFETCH(int, actions);
+    QFETCH(bool, iconBackground);
+    QFETCH(QString, expected);
+    QList<QUrl> icons;
+    for (int i = 0; i < actions; ++i)
+        icons << QUrl(QStringLiteral("image://theme/icon-%1").arg(i));
+    const QString payload = DeclarativeCoverActionList::buildPayload(
+            windowId, enabled, QStringLiteral("org.quorvaneos.coveraction.pid7.id1"), icons, iconBackground);
+    QCOMPARE(payload, expected);
+    if (!expected.isEmpty())
+        QCOMPARE(payload.split(QLatin1Char('\n')).size(), 4 * actions + 1);
+}
+
+void tst_DeclarativeCoverActionList::removeEntries_data()
+{
+    QTest::addColumn<QString>("payload");
+    QTest::addColumn<QString>("expected");
+    const QString a = QStringLiteral("org.quorvaneos.coveraction.pid7.id1");
+    const QString b = QStringLiteral("org.quorvaneos.coveraction.pid7.id2");
+    QTest::newRow("other list stays") << a + "\ntrigger\n0\nx\n" + b + "\ntrigger\n0\ny\n1" << b + "\ntrigger\n0\ny\n1";
+    QTest::newRow("only this list") << a + "\ntrigger\n0\nx\n" + a + "\ntrigger\n1\nz\n0" << "";
+    QTest::newRow("cut short") << a + "\ntrigger" << "";
+    QTest::newRow("not ours, unreadable") << "garbage\n" + b + "\ntrigger\n0\ny\n1" << b + "\ntrigger\n0\ny\n1";
+}
+
+void tst_DeclarativeCoverActionList::removeEntries()
+{
+    QFETCH(QString, payload);
+    QFETCH(QString, expected);
+    QCOMPARE(DeclarativeCoverActionList::removeEntries(payload, QStringLiteral("org.quorvaneos.coveraction.pid7.id1")), expected);
+}
+
+void tst_DeclarativeCoverActionList::changesArePublishedTogether()
+{
+    QStringList published;
+    WindowPropertyPublisher::setSinkForTesting([&published](QWindow *, const QString &name, const QVariant &value) {
+        if (name == QLatin1String("_APP_COVER_ACTION"))
+            published << value.toString();
+    }, QStringLiteral("wayland"));
+
+    QQuickWindow window;
+    window.show();
+    QVERIFY(QTest::qWaitForWindowExposed(&window));
+    auto list = new DeclarativeCoverActionList; // wayland is decided at construction
+    m_made << list;
+    list->setWindow(&window);
+    auto action = new DeclarativeCoverAction(list);
+    action->setIconSource(QUrl(QStringLiteral("image://theme/a")));
+    list->appendAction(action);
+    list->setIconBackground(true);
+    list->componentComplete();
+    QTRY_COMPARE(published.size(), 1);
+    QTest::qWait(30);
+    QCOMPARE(published.size(), 1);
+    QVERIFY(published.first().endsWith(QLatin1String("\n0\nimage://theme/a\n1")));
+
+    // Disabled: its entries are taken out of the window's payload.
+    list->setEnabled(false);
+    QTRY_COMPARE(published.size(), 2);
+    QCOMPARE(published.last(), QString());
+}
+
+QTEST_MAIN(tst_DeclarativeCoverActionList)
+#include "tst_declarativecoveractionlist.moc"
