@@ -151,6 +151,9 @@ void tst_Registration::creatableTypes_data()
     QTest::newRow("Window") << QByteArray("Private.Window") << QByteArray("DeclarativeWindow");
     QTest::newRow("Formatter") << QByteArray("Formatter") << QByteArray("DeclarativeFormatter");
     QTest::newRow("PageStackBase") << QByteArray("PageStackBase") << QByteArray("DeclarativePageStackBase");
+    QTest::newRow("Cover") << QByteArray("Cover") << QByteArray("DeclarativeCover");
+    QTest::newRow("CoverAction") << QByteArray("CoverAction") << QByteArray("DeclarativeCoverAction");
+    QTest::newRow("CoverActionList") << QByteArray("CoverActionList") << QByteArray("DeclarativeCoverActionList");
     QTest::newRow("BounceEffect") << QByteArray("BounceEffect") << QByteArray("DeclarativeBounceEffect");
     QTest::newRow("PulleyMenuLogic") << QByteArray("Private.PulleyMenuLogic") << QByteArray("PulleyMenuLogic");
     QTest::newRow("FormattingProxyModel") << QByteArray("FormattingProxyModel") << QByteArray("FormattingProxyModel");
