@@ -1,12 +1,15 @@
 #include "moduleregistration.h"
 
 #include "coreregistration.h"
+#include "autofill.h"
 #include "declarativebounceeffect.h"
 #include "declarativecover.h"
 #include "declarativecoveraction.h"
 #include "declarativecoveractionlist.h"
 #include "declarativecoverwindow.h"
+#include "declarativeenterkey.h"
 #include "declarativeformatter.h"
+#include "declarativepreedittext.h"
 #include "declarativepagestackbase.h"
 #include "declarativewindow.h"
 #include "formattingproxymodel.h"
@@ -76,6 +79,7 @@ void registerPublicModule(const char *uri)
     registerUncreatable<DeclarativePageStackAction>(uri, "PageStackAction");
     registerUncreatable<DeclarativeTabViewAction>(uri, "TabViewAction");
     registerUncreatable<DeclarativeDock>(uri, "Dock");
+    registerUncreatable<DeclarativeEnterKey>(uri, "EnterKey");
     qmlRegisterType<DeclarativePageStackBase>(uri, 1, 0, "PageStackBase");
     qmlRegisterType<DeclarativeBounceEffect>(uri, 1, 0, "BounceEffect");
     qmlRegisterType<DeclarativeCoverAction>(uri, 1, 0, "CoverAction");
@@ -95,7 +99,9 @@ void registerPrivateModule(const char *uri)
     qmlRegisterRevision<QQuickWindow, 1>(uri, 1, 0);
     qmlRegisterType<DeclarativeWindow>(uri, 1, 0, "Window");
     qmlRegisterType<DeclarativeCoverWindow>(uri, 1, 0, "CoverWindow");
+    qmlRegisterType<DeclarativePreeditText>(uri, 1, 0, "PreeditText");
     qmlRegisterType<PulleyMenuLogic>(uri, 1, 0, "PulleyMenuLogic");
+    qmlRegisterType<AutoFill>(uri, 1, 0, "AutoFill");
     registerUncreatable<TimePickerMode>(uri, "TimePickerMode");
 }
 

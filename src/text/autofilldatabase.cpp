@@ -1,0 +1,134 @@
+#include "autofilldatabase.h"
+#include "pelkanlogging.h"
+
+#include <QDir>
+#include <QFile>
+#include <QStandardPaths>
+#include <QTemporaryFile>
+
+#include <cstdio>
+
+namespace {
+// File names are limited to 255 bytes; keep clear of it.
+const int MaximumKeyLength = 200;
+} // namespace
+
+AutoFillDatabase *AutoFillDatabase::instance()
+{
+    static AutoFillDatabase database(QStandardPaths::writableLocation(QStandardPaths::GenericDataLocation)
+                                     + QLatin1String("/system/privileged/autofill"));
+    return &database;
+}
+
+AutoFillDatabase::AutoFillDatabase(const QString &directory)
+    : m_directory(directory)
+{
+}
+
+bool AutoFillDatabase::isUsableKey(const QString &key)
+{
+    return !key.isEmpty() && key != QLatin1String(".") && key != QLatin1String("..")
+            && !key.contains(QLatin1Char('/')) && key.toUtf8().size() <= MaximumKeyLength;
+}
+
+bool AutoFillDatabase::ensureDirectory()
+{
+    if (m_directoryReady)
+        return true;
+    if (m_directoryFailed)
+        return false;
+    if (!QDir().mkpath(m_directory)) {
+        m_directoryFailed = true;
+        qCWarning(lcPelkanCoreLog, "Unable to create a directory for the auto fill database.");
+        return false;
+    }
+    m_directoryReady = true;
+    return true;
+}
+
+AutoFillDatabase::Entry *AutoFillDatabase::entry(const QString &key)
+{
+    if (!isUsableKey(key)) {
+        qCWarning(lcPelkanCoreLog) << "AutoFill: the key" << key.left(40) << "does not name a file; refused";
+        return nullptr;
+    }
+    auto it = m_entries.find(key);
+    if (it == m_entries.end()) {
+        Entry loaded;
+        if (ensureDirectory())
+            loaded.suggestions = readFile(m_directory + QLatin1Char('/') + key);
+        it = m_entries.insert(key, loaded);
+    }
+    return &*it;
+}
+
+QStringList AutoFillDatabase::suggestions(const QString &key)
+{
+    Entry *e = entry(key);
+    return e ? e->suggestions : QStringList();
+}
+
+bool AutoFillDatabase::insert(const QString &key, const QString &suggestion)
+{
+    Entry *e = entry(key);
+    if (!e)
+        return false;
+    e->suggestions.removeOne(suggestion);
+    e->suggestions.prepend(suggestion);
+    while (e->suggestions.size() > MaximumEntries)
+        e->suggestions.removeLast();
+    e->dirty = true;
+    return true;
+}
+
+bool AutoFillDatabase::remove(const QString &key, const QString &suggestion)
+{
+    Entry *e = entry(key);
+    if (!e || !e->suggestions.removeOne(suggestion))
+        return false;
+    e->dirty = true;
+    return true;
+}
+
+void AutoFillDatabase::save()
+{
+    if (!ensureDirectory())
+        return;
+    for (auto it = m_entries.begin(); it != m_entries.end(); ++it) {
+        if (it->dirty && writeFile(m_directory + QLatin1Char('/') + it.key(), it->suggestions))
+            it->dirty = false;
+    }
+}
+
+QStringList AutoFillDatabase::readFile(const QString &path)
+{
+    QStringList lines;
+    QFile file(path);
+    if (!file.open(QIODevice::ReadOnly))
+        return lines;
+    while (!file.atEnd()) {
+        const QString line = QString::fromUtf8(file.readLine()).trimmed();
+        if (!line.isEmpty())
+            lines.append(line);
+    }
+    return lines;
+}
+
+bool AutoFillDatabase::writeFile(const QString &path, const QStringList &lines)
+{
+    QTemporaryFile temporary(QFileInfo(path).absoluteFilePath());
+    temporary.setAutoRemove(false);
+    if (!temporary.open())
+        return false;
+    for (const QString &line : lines) {
+        temporary.write(line.toUtf8());
+        temporary.write("\n", 1);
+    }
+    const bool flushed = temporary.flush();
+    temporary.close();
+    if (!flushed || std::rename(QFile::encodeName(temporary.fileName()).constData(), QFile::encodeName(path).constData()) != 0) {
+        QFile::remove(temporary.fileName());
+        return false;
+    }
+    return true;
+}
