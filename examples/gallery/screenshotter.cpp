@@ -7,7 +7,9 @@
 #include <QTextStream>
 #include <QTimer>
 
-// Frames to wait so that images loaded asynchronously are on screen.
+// Time and frames to wait, so that images loading asynchronously and short timers (such
+// as suggestions appearing after typing) are on screen.
+static const int SettleMs = 500;
 static const int SettleFrames = 3;
 static const int TimeoutMs = 30000;
 
@@ -16,7 +18,10 @@ Screenshotter::Screenshotter(QQuickWindow *window, const QString &path, QObject 
     , m_window(window)
     , m_path(QFileInfo(path).absoluteFilePath())
 {
-    connect(window, &QQuickWindow::frameSwapped, this, &Screenshotter::frameSwapped, Qt::QueuedConnection);
+    QTimer::singleShot(SettleMs, this, [this] {
+        connect(m_window, &QQuickWindow::frameSwapped, this, &Screenshotter::frameSwapped, Qt::QueuedConnection);
+        m_window->update();
+    });
     QTimer::singleShot(TimeoutMs, this, [this] { fail(QStringLiteral("no frame was rendered in time")); });
 }
 

@@ -123,7 +123,7 @@ void tst_Registration::uncreatableTypesFail_data()
     for (const char *name : { "PageStatus", "PageNavigation", "DialogStatus", "DialogResult", "FocusBehavior",
                               "OpacityRamp", "TouchInteraction", "Orientation", "TruncationMode", "DateTime",
                               "PageStackAction", "TabViewAction", "Dock", "BusyIndicatorSize",
-                              "Private.TimePickerMode" }) {
+                              "Private.TimePickerMode", "EnterKey" }) {
         QTest::newRow(name) << QByteArray(name);
     }
 }
@@ -152,6 +152,8 @@ void tst_Registration::creatableTypes_data()
     QTest::newRow("Formatter") << QByteArray("Formatter") << QByteArray("DeclarativeFormatter");
     QTest::newRow("PageStackBase") << QByteArray("PageStackBase") << QByteArray("DeclarativePageStackBase");
     QTest::newRow("Cover") << QByteArray("Cover") << QByteArray("DeclarativeCover");
+    QTest::newRow("PreeditText") << QByteArray("Private.PreeditText") << QByteArray("DeclarativePreeditText");
+    QTest::newRow("AutoFill") << QByteArray("Private.AutoFill") << QByteArray("AutoFill");
     QTest::newRow("CoverAction") << QByteArray("CoverAction") << QByteArray("DeclarativeCoverAction");
     QTest::newRow("CoverActionList") << QByteArray("CoverActionList") << QByteArray("DeclarativeCoverActionList");
     QTest::newRow("BounceEffect") << QByteArray("BounceEffect") << QByteArray("DeclarativeBounceEffect");

@@ -6,7 +6,7 @@ import Quorvane.Pelkan.private 1.0 as Private
 Window {
     id: window
 
-    // Which page the gallery opens on ("theme", "orientation", "format", "gestures", "cover").
+    // Which page the gallery opens on ("theme", "orientation", "format", "gestures", "cover", "text").
     property string initialPage: "theme"
 
     visible: true
@@ -29,15 +29,15 @@ Window {
             Repeater {
                 model: [{ name: "theme", title: "Theme" }, { name: "orientation", title: "Orientation" },
                         { name: "format", title: "Format" }, { name: "gestures", title: "Gestures" },
-                        { name: "cover", title: "Cover" }]
+                        { name: "cover", title: "Cover" }, { name: "text", title: "Text" }]
                 Item {
-                    width: tabs.width / 5
+                    width: tabs.width / 6
                     height: tabs.height
                     Text {
                         anchors.centerIn: parent
                         text: modelData.title
                         color: tabs.current === modelData.name ? Theme.highlightColor : Theme.secondaryColor
-                        font.pixelSize: Theme.fontSizeSmall
+                        font.pixelSize: Theme.fontSizeSmall * 0.85
                     }
                     MouseArea {
                         anchors.fill: parent
@@ -52,7 +52,8 @@ Window {
             source: tabs.current === "orientation" ? "OrientationPage.qml"
                   : tabs.current === "format" ? "FormatPage.qml"
                   : tabs.current === "gestures" ? "GesturesPage.qml"
-                  : tabs.current === "cover" ? "CoverPage.qml" : "ThemePage.qml"
+                  : tabs.current === "cover" ? "CoverPage.qml"
+                  : tabs.current === "text" ? "TextPage.qml" : "ThemePage.qml"
             onLoaded: if (item.hasOwnProperty("applicationWindow")) item.applicationWindow = applicationWindow
         }
     }
