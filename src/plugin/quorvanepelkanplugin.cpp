@@ -3,6 +3,7 @@
 #include "translator.h"
 
 #include "coreregistration.h"
+#include "declarativeimageprovider.h"
 #include "screen.h"
 #include "timezoneupdater.h"
 
@@ -49,6 +50,8 @@ void QuorvanePelkanPlugin::initializeEngine(QQmlEngine *engine, const char *uri)
         return;
 
     Pelkan::Private::initializeEngine(engine, uri);
+    if (!engine->imageProvider(QStringLiteral("theme")))
+        engine->addImageProvider(QStringLiteral("theme"), new DeclarativeImageProvider);
 
     QQmlContext *context = engine->rootContext();
     context->setContextProperty(QStringLiteral("screen"), Pelkan::Screen::instance());

@@ -1,0 +1,58 @@
+#include "themeimagedecoder.h"
+#include "pelkanlogging.h"
+#include "theme.h"
+#include "themepixels.h"
+
+#include <QImageReader>
+#include <QMutex>
+
+QColor ThemeImageRecord::effectiveColor() const
+{
+    switch (tint) {
+    case Colour:
+        return color;
+    case ThemePrimary:
+        return Pelkan::Theme::instance()->primaryColor();
+    default:
+        return QColor();
+    }
+}
+
+namespace ThemeImageDecoder {
+
+ThemeImageRecord parseId(const QString &id)
+{
+    ThemeImageRecord record;
+    const int mark = id.indexOf(QLatin1Char('?'));
+    record.name = mark < 0 ? id : id.left(mark);
+    if (mark >= 0)
+        record.color.setNamedColor(id.mid(mark + 1));
+    return record;
+}
+
+QImage decode(const QString &path, ThemeImageRecord &record, const QSize &requestedSize)
+{
+    QImageReader reader(path);
+    if (record.color.isValid()) {
+        record.tint = ThemeImageRecord::Colour;
+    } else if (reader.text(QStringLiteral("Grayscale")) == QLatin1String("true")) {
+        record.tint = ThemeImageRecord::ThemePrimary;
+        record.themeTinted = true;
+    } else {
+        record.tint = ThemeImageRecord::Copy;
+    }
+    if (requestedSize.width() > 0 && requestedSize.height() > 0)
+        reader.setScaledSize(requestedSize);
+
+    const QImage image = reader.read();
+    if (image.isNull()) {
+        if (reader.error() != QImageReader::FileNotFoundError)
+            qCWarning(lcPelkanCoreLog) << "Failed to load" << reader.fileName() << reader.errorString();
+        return QImage();
+    }
+    record.imageSize = image.size();
+    record.hasAlpha = image.hasAlphaChannel();
+    return ThemePixels::render(image, record.effectiveColor(), true);
+}
+
+} // namespace ThemeImageDecoder

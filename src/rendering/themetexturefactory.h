@@ -1,0 +1,31 @@
+#pragma once
+
+#include "themeimagerecord.h"
+
+#include <QImage>
+#include <QQuickTextureFactory>
+
+class DeclarativeImageProvider;
+
+// Carries a decoded theme image from the image loader to the render thread, where it
+// becomes an atlas or standalone texture of the window; it then lets go of the pixels.
+class ThemeTextureFactory : public QQuickTextureFactory
+{
+    Q_OBJECT
+
+public:
+    ThemeTextureFactory(DeclarativeImageProvider *provider, const ThemeImageRecord &record, const QString &path,
+                        const QImage &bordered, quint32 generation);
+
+    QSGTexture *createTexture(QQuickWindow *window) const override;
+    QSize textureSize() const override;
+    int textureByteCount() const override { return int(m_image.sizeInBytes()); }
+    QImage image() const override;
+
+private:
+    DeclarativeImageProvider *m_provider;
+    ThemeImageRecord m_record;
+    mutable QString m_path;
+    mutable QImage m_image;
+    quint32 m_generation;
+};
