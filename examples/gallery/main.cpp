@@ -25,7 +25,7 @@ int main(int argc, char *argv[])
                                         QStringLiteral("Render once, save a PNG to <file> and quit."),
                                         QStringLiteral("file"));
     parser.addOption(screenshot);
-    const QCommandLineOption page(QStringLiteral("page"), QStringLiteral("Open on <page>: theme, orientation, format, gestures, cover, text."),
+    const QCommandLineOption page(QStringLiteral("page"), QStringLiteral("Open on <page>: theme, images, orientation, format, gestures, cover, text."),
                                   QStringLiteral("page"), QStringLiteral("theme"));
     parser.addOption(page);
     parser.process(app);

@@ -108,7 +108,6 @@ private Q_SLOTS:
     void survivesMenuDestroyedBySnapHandler();
     void clampsFittingContent_data();
     void clampsFittingContent();
-    void dragDistance();
 
 private:
     FakeMenu *m_menu = nullptr;
@@ -292,17 +291,6 @@ void tst_PulleyMenuLogic::clampsFittingContent()
     (pullDown ? m_flickable->pushUpMenu : m_flickable->pullDownMenu) = otherMenu ? &other : nullptr;
     m_flickable->setContentY(contentY);
     QCOMPARE(m_flickable->contentY, expected);
-}
-
-void tst_PulleyMenuLogic::dragDistance()
-{
-    QSignalSpy changed(m_logic, &PulleyMenuLogic::dragDistanceChanged);
-    m_menu->inactivePosition = -20;
-    m_flickable->setContentY(-70);
-    QCOMPARE(m_logic->dragDistance(), 50.0f);
-    m_flickable->setContentY(30);
-    QCOMPARE(m_logic->dragDistance(), 0.0f);
-    QCOMPARE(changed.count(), 2);
 }
 
 QTEST_MAIN(tst_PulleyMenuLogic)

@@ -58,7 +58,6 @@ private Q_SLOTS:
     void observersSeeTouchEvents();
     void observersSeeGrabLoss();
     void leavingTheWindowWarnsOnlyForATree();
-    void findWindowWalksUpTheParents();
     void noPropertiesOffWayland();
     void propertiesInOrder();
     void coverAttachAndDestroy();
@@ -319,19 +318,6 @@ void tst_DeclarativeWindow::leavingTheWindowWarnsOnlyForATree()
     delete window;
     qInstallMessageHandler(previous);
     QCOMPARE(warnings, 0);
-}
-
-void tst_DeclarativeWindow::findWindowWalksUpTheParents()
-{
-    DeclarativeWindow window;
-    QQuickItem middle(&window);
-    QQuickItem leaf(&middle);
-    QQuickItem orphan;
-    QCOMPARE(DeclarativeWindow::findWindow(&leaf), &window);
-    QCOMPARE(DeclarativeWindow::findWindow(&middle), &window);
-    QCOMPARE(DeclarativeWindow::findWindow(&window), nullptr);
-    QCOMPARE(DeclarativeWindow::findWindow(&orphan), nullptr);
-    QCOMPARE(DeclarativeWindow::findWindow(nullptr), nullptr);
 }
 
 void tst_DeclarativeWindow::noPropertiesOffWayland()

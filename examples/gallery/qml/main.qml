@@ -6,7 +6,7 @@ import Quorvane.Pelkan.private 1.0 as Private
 Window {
     id: window
 
-    // Which page the gallery opens on ("theme", "orientation", "format", "gestures", "cover", "text").
+    // Which page the gallery opens on: theme, images, orientation, format, gestures, cover, text.
     property string initialPage: "theme"
 
     visible: true
@@ -27,11 +27,12 @@ Window {
             height: Theme.itemSizeSmall
 
             Repeater {
-                model: [{ name: "theme", title: "Theme" }, { name: "orientation", title: "Orientation" },
+                model: [{ name: "theme", title: "Theme" }, { name: "images", title: "Images" },
+                        { name: "orientation", title: "Orient." },
                         { name: "format", title: "Format" }, { name: "gestures", title: "Gestures" },
                         { name: "cover", title: "Cover" }, { name: "text", title: "Text" }]
                 Item {
-                    width: tabs.width / 6
+                    width: tabs.width / 7
                     height: tabs.height
                     Text {
                         anchors.centerIn: parent
@@ -53,7 +54,8 @@ Window {
                   : tabs.current === "format" ? "FormatPage.qml"
                   : tabs.current === "gestures" ? "GesturesPage.qml"
                   : tabs.current === "cover" ? "CoverPage.qml"
-                  : tabs.current === "text" ? "TextPage.qml" : "ThemePage.qml"
+                  : tabs.current === "text" ? "TextPage.qml"
+                  : tabs.current === "images" ? "ImagesPage.qml" : "ThemePage.qml"
             onLoaded: if (item.hasOwnProperty("applicationWindow")) item.applicationWindow = applicationWindow
         }
     }

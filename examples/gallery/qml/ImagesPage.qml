@@ -1,0 +1,60 @@
+import QtQuick 2.6
+import Quorvane.Pelkan 1.0
+
+// Theme images through the "theme" image provider, tinted by the colour in their name.
+// The pattern tile is marked Grayscale: it follows the theme's primary colour on the GPU
+// side, without being reloaded. Try
+//   dconf write /desktop/quorvane/pelkan/theme/primary_color "'#ffb000'"
+Flickable {
+    id: page
+    contentHeight: column.height + Theme.paddingLarge
+    readonly property var icons: ["icon-m-back", "icon-m-forward", "icon-m-add", "icon-m-close",
+                                  "icon-m-search", "icon-m-menu", "icon-m-home", "icon-m-favorite"]
+
+    Column {
+        id: column
+        x: Theme.horizontalPageMargin
+        width: parent.width - 2 * Theme.horizontalPageMargin
+        spacing: Theme.paddingMedium
+
+        Repeater {
+            model: [{ title: "Highlight colour", suffix: "?" + Theme.highlightColor },
+                    { title: "Named tint", suffix: "?#ff6f61" },
+                    { title: "As drawn", suffix: "" }]
+            Column {
+                id: row
+                property string suffix: modelData.suffix
+                width: column.width
+                spacing: Theme.paddingSmall
+                SectionHeader { text: modelData.title }
+                Flow {
+                    width: parent.width
+                    spacing: Theme.paddingLarge
+                    Repeater {
+                        model: page.icons
+                        Image {
+                            width: Theme.iconSizeMedium
+                            height: width
+                            sourceSize: Qt.size(width, height)
+                            source: "image://theme/" + modelData + row.suffix
+                        }
+                    }
+                }
+            }
+        }
+
+        SectionHeader { text: "Follows the primary colour" }
+
+        Row {
+            spacing: Theme.paddingLarge
+            Repeater {
+                model: 4
+                Image {
+                    width: Theme.iconSizeLarge
+                    height: width
+                    source: "image://theme/graphic-shader-texture"
+                }
+            }
+        }
+    }
+}
