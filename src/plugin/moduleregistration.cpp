@@ -9,6 +9,7 @@
 #include "declarativecoverwindow.h"
 #include "declarativeenterkey.h"
 #include "declarativeformatter.h"
+#include "declarativeglassitem.h"
 #include "declarativepreedittext.h"
 #include "declarativepagestackbase.h"
 #include "declarativewindow.h"
@@ -82,6 +83,7 @@ void registerPublicModule(const char *uri)
     registerUncreatable<DeclarativeEnterKey>(uri, "EnterKey");
     qmlRegisterType<DeclarativePageStackBase>(uri, 1, 0, "PageStackBase");
     qmlRegisterType<DeclarativeBounceEffect>(uri, 1, 0, "BounceEffect");
+    qmlRegisterType<DeclarativeGlassItem>(uri, 1, 0, "GlassItem");
     qmlRegisterType<DeclarativeCoverAction>(uri, 1, 0, "CoverAction");
     qmlRegisterType<DeclarativeCoverActionList>(uri, 1, 0, "CoverActionList");
     qmlRegisterType<DeclarativeFormatter>(uri, 1, 0, "Formatter");

@@ -2,8 +2,6 @@
 
 #include "themeiconresolver.h"
 
-#include <QHash>
-#include <QMutex>
 #include <QQuickImageProvider>
 
 class QQuickWindow;
@@ -13,6 +11,11 @@ class ThemeTextureAtlas;
 // "image://theme/icon-m-back?#ff8800". Small images of a window share one texture atlas
 // so the scene graph can draw them in one batch; images marked Grayscale follow the
 // theme's primary colour, re-tinted on the GPU side without QML reloading anything.
+//
+// Qt's pixmap cache is shared by every engine of the process and keeps texture factories
+// beyond the engine (and provider) that made them, so factories and atlases depend on no
+// provider: they carry their own copy of the icon resolver, and the window atlases are
+// kept process-wide.
 class DeclarativeImageProvider : public QQuickImageProvider
 {
 public:
@@ -22,7 +25,7 @@ public:
     QQuickTextureFactory *requestTexture(const QString &id, QSize *size, const QSize &requestedSize) override;
 
     // The window's atlas, made on first use (render thread).
-    ThemeTextureAtlas *atlasFor(QQuickWindow *window);
+    static ThemeTextureAtlas *atlasFor(QQuickWindow *window, const Pelkan::ThemeIconResolver &resolver);
     const Pelkan::ThemeIconResolver &resolver() const { return m_resolver; }
 
     // Bumped on every change of the theme's primary colour.
@@ -30,6 +33,4 @@ public:
 
 private:
     Pelkan::ThemeIconResolver m_resolver;
-    QMutex m_mutex;
-    QHash<QQuickWindow *, ThemeTextureAtlas *> m_atlases;
 };

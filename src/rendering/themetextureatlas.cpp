@@ -7,7 +7,7 @@
 #include <QOpenGLContext>
 #include <QOpenGLFunctions>
 
-ThemeTextureAtlas::ThemeTextureAtlas(const Pelkan::ThemeIconResolver *resolver, int side)
+ThemeTextureAtlas::ThemeTextureAtlas(const Pelkan::ThemeIconResolver &resolver, int side)
     : m_resolver(resolver)
     , m_side(side)
     , m_allocator(QSize(side, side))
@@ -62,7 +62,7 @@ QSGTexture *ThemeTextureAtlas::create(const ThemeImageRecord &record, const QStr
 QImage ThemeTextureAtlas::decodeAgain(const ThemeImageRecord &record, bool bordered) const
 {
     ThemeImageRecord copy = record;
-    const QImage image = ThemeImageDecoder::decode(m_resolver->resolvePath(record.name), copy, record.imageSize);
+    const QImage image = ThemeImageDecoder::decode(m_resolver.resolvePath(record.name), copy, record.imageSize);
     if (bordered || image.isNull())
         return image;
     return image.copy(1, 1, image.width() - 2, image.height() - 2);

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "themeiconresolver.h"
 #include "themeimagerecord.h"
 
 #include <QImage>
@@ -12,7 +13,6 @@
 class QSGTexture;
 class ThemeAtlasTexture;
 class ThemeTexture;
-namespace Pelkan { class ThemeIconResolver; }
 
 // One window's shared texture for small theme images. Images smaller than half its side
 // are packed into it; larger ones, and any that no longer fit, get textures of their own.
@@ -22,7 +22,7 @@ class ThemeTextureAtlas : public QObject
     Q_OBJECT
 
 public:
-    ThemeTextureAtlas(const Pelkan::ThemeIconResolver *resolver, int side);
+    ThemeTextureAtlas(const Pelkan::ThemeIconResolver &resolver, int side);
     ~ThemeTextureAtlas() override;
 
     // 512, or the largest power of two not above the window's longer side minus one when
@@ -47,7 +47,7 @@ public:
     int standaloneCount() const { return m_standalone.size(); }
 
 private:
-    const Pelkan::ThemeIconResolver *m_resolver;
+    const Pelkan::ThemeIconResolver m_resolver;
     int m_side;
     QSGAreaAllocator m_allocator;
     QVector<ThemeAtlasTexture *> m_pending;

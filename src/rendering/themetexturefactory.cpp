@@ -3,9 +3,9 @@
 #include "themeimagedecoder.h"
 #include "themetextureatlas.h"
 
-ThemeTextureFactory::ThemeTextureFactory(DeclarativeImageProvider *provider, const ThemeImageRecord &record,
+ThemeTextureFactory::ThemeTextureFactory(const Pelkan::ThemeIconResolver &resolver, const ThemeImageRecord &record,
                                          const QString &path, const QImage &bordered, quint32 generation)
-    : m_provider(provider)
+    : m_resolver(resolver)
     , m_record(record)
     , m_path(path)
     , m_image(bordered)
@@ -20,12 +20,12 @@ QSize ThemeTextureFactory::textureSize() const
 
 QSGTexture *ThemeTextureFactory::createTexture(QQuickWindow *window) const
 {
-    ThemeTextureAtlas *atlas = m_provider->atlasFor(window);
+    ThemeTextureAtlas *atlas = DeclarativeImageProvider::atlasFor(window, m_resolver);
     if (!atlas)
         return nullptr;
     if (!m_image.isNull() && m_generation != DeclarativeImageProvider::colorGeneration()) {
         // Made for an older theme colour: tinted ones, and files that moved, are redone.
-        if (m_record.themeTinted || m_provider->resolver().resolvePath(m_record.name) != m_path)
+        if (m_record.themeTinted || m_resolver.resolvePath(m_record.name) != m_path)
             m_image = QImage();
     }
     QSGTexture *texture = atlas->create(m_record, m_path, m_image);
@@ -38,7 +38,7 @@ QImage ThemeTextureFactory::image() const
 {
     if (m_image.isNull()) {
         ThemeImageRecord record = m_record;
-        const QImage decoded = ThemeImageDecoder::decode(m_provider->resolver().resolvePath(m_record.name), record,
+        const QImage decoded = ThemeImageDecoder::decode(m_resolver.resolvePath(m_record.name), record,
                                                          m_record.imageSize);
         return decoded.isNull() ? QImage() : decoded.copy(1, 1, decoded.width() - 2, decoded.height() - 2);
     }

@@ -1,11 +1,10 @@
 #pragma once
 
+#include "themeiconresolver.h"
 #include "themeimagerecord.h"
 
 #include <QImage>
 #include <QQuickTextureFactory>
-
-class DeclarativeImageProvider;
 
 // Carries a decoded theme image from the image loader to the render thread, where it
 // becomes an atlas or standalone texture of the window; it then lets go of the pixels.
@@ -14,7 +13,7 @@ class ThemeTextureFactory : public QQuickTextureFactory
     Q_OBJECT
 
 public:
-    ThemeTextureFactory(DeclarativeImageProvider *provider, const ThemeImageRecord &record, const QString &path,
+    ThemeTextureFactory(const Pelkan::ThemeIconResolver &resolver, const ThemeImageRecord &record, const QString &path,
                         const QImage &bordered, quint32 generation);
 
     QSGTexture *createTexture(QQuickWindow *window) const override;
@@ -23,7 +22,7 @@ public:
     QImage image() const override;
 
 private:
-    DeclarativeImageProvider *m_provider;
+    Pelkan::ThemeIconResolver m_resolver;
     ThemeImageRecord m_record;
     mutable QString m_path;
     mutable QImage m_image;

@@ -271,6 +271,11 @@ int DeclarativeWindow::screenRotation() const
     return s_screenRotation;
 }
 
+int DeclarativeWindow::configuredScreenRotation()
+{
+    return s_screenRotation;
+}
+
 // Window state mirrored to the compositor -----------------------------------------------
 
 void DeclarativeWindow::setBackgroundVisible(bool visible)

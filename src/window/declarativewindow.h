@@ -82,6 +82,8 @@ public:
     bool orientationLocked() const { return m_orientationLocked; }
     void setOrientationLocked(bool locked);
     int screenRotation() const;
+    // The configured rotation of the display, as last read by any window.
+    static int configuredScreenRotation();
 
     bool backgroundVisible() const { return m_backgroundVisible; }
     void setBackgroundVisible(bool visible);

@@ -147,7 +147,7 @@ void tst_ThemePixels::atlasPlacement()
     QFETCH(QSize, image);
     QFETCH(bool, inAtlas);
     const Pelkan::ThemeIconResolver resolver(QStringLiteral("/nonexistent"), 1.0);
-    ThemeTextureAtlas atlas(&resolver, 512);
+    ThemeTextureAtlas atlas(resolver, 512);
     ThemeImageRecord record;
     record.imageSize = image;
     QImage bordered(image + QSize(2, 2), QImage::Format_RGBA8888_Premultiplied);
@@ -165,7 +165,7 @@ void tst_ThemePixels::atlasPlacement()
 void tst_ThemePixels::fullAtlasGoesStandalone()
 {
     const Pelkan::ThemeIconResolver resolver(QStringLiteral("/nonexistent"), 1.0);
-    ThemeTextureAtlas atlas(&resolver, 512);
+    ThemeTextureAtlas atlas(resolver, 512);
     ThemeImageRecord record;
     record.imageSize = QSize(200, 200);
     const QImage bordered(202, 202, QImage::Format_RGBA8888_Premultiplied);

@@ -37,6 +37,7 @@ QQuickItem *tst_DeclarativeEnterKey::load(const QByteArray &body)
     }
     m_window.reset(new QQuickWindow);
     root->setParentItem(m_window->contentItem());
+    root->setParent(m_window.data()); // owned by the window, gone with it
     m_window->resize(300, 200);
     m_window->show();
     m_window->requestActivate();

@@ -39,6 +39,7 @@ void tst_DeclarativePreeditText::init()
     m_preedit = m_field->property("preedit").value<DeclarativePreeditText *>();
     m_window.reset(new QQuickWindow);
     m_field->setParentItem(m_window->contentItem());
+    m_field->setParent(m_window.data()); // owned by the window, gone with it
     m_window->show();
     m_window->requestActivate();
     QVERIFY(QTest::qWaitForWindowActive(m_window.data()));

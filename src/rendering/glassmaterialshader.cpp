@@ -1,0 +1,101 @@
+#include "glassmaterialshader.h"
+#include "glassmaterial.h"
+
+#include <QFile>
+#include <QMatrix4x4>
+#include <QOpenGLContext>
+#include <QOpenGLFunctions>
+#include <QSGTexture>
+
+namespace {
+
+QByteArray readShader(const char *name)
+{
+    QFile file(QLatin1String(":/quorvane/pelkan/shaders/") + QLatin1String(name));
+    return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray();
+}
+
+const char *dashCoordinate(int angle)
+{
+    switch (angle) {
+    case 90:
+        return "(gl_FragCoord.y + dash.z)";
+    case 180:
+        return "(gl_FragCoord.x + dash.z)";
+    case 270:
+        return "(gl_FragCoord.y - dash.z)";
+    default:
+        return "(gl_FragCoord.x - dash.z)";
+    }
+}
+
+} // namespace
+
+GlassMaterialShader::GlassMaterialShader(int angle)
+    : m_vertex(readShader("glass.vert"))
+    , m_fragment(readShader("glass.frag").replace("DASH_COORDINATE", dashCoordinate(angle)))
+{
+}
+
+const char *const *GlassMaterialShader::attributeNames() const
+{
+    static const char *const names[] = { "vertex", "a_texCoord", nullptr };
+    return names;
+}
+
+void GlassMaterialShader::initialize()
+{
+    QOpenGLShaderProgram *p = program();
+    m_matrix = p->uniformLocation("qt_Matrix");
+    m_patternMatrix = p->uniformLocation("patternMatrix");
+    m_opacity = p->uniformLocation("qt_Opacity");
+    m_color = p->uniformLocation("color");
+    m_backgroundColor = p->uniformLocation("backgroundColor");
+    m_centersize = p->uniformLocation("centersize");
+    m_border = p->uniformLocation("border");
+    m_sigma = p->uniformLocation("sigma");
+    m_brightness = p->uniformLocation("brightness");
+    m_size = p->uniformLocation("size");
+    m_dash = p->uniformLocation("dash");
+    m_pattern = p->uniformLocation("patternTexture");
+}
+
+void GlassMaterialShader::updateState(const RenderState &state, QSGMaterial *newMaterial, QSGMaterial *)
+{
+    QOpenGLShaderProgram *p = program();
+    const GlassState &glass = static_cast<GlassMaterial *>(newMaterial)->state();
+    if (state.isMatrixDirty())
+        p->setUniformValue(m_matrix, state.combinedMatrix());
+    if (state.isOpacityDirty())
+        p->setUniformValue(m_opacity, state.opacity());
+
+    QSize textureSize(1, 1);
+    if (QSGTexture *texture = glass.pattern) {
+        // The pattern tiles across the screen: it needs a texture of its own.
+        if (texture->isAtlasTexture())
+            texture = texture->removedFromAtlas();
+        if (texture) {
+            texture->setHorizontalWrapMode(QSGTexture::Repeat);
+            texture->setVerticalWrapMode(QSGTexture::Repeat);
+            state.context()->functions()->glActiveTexture(GL_TEXTURE0);
+            texture->bind();
+            textureSize = texture->textureSize().expandedTo(QSize(1, 1));
+        }
+    }
+    // One texel per device pixel, anchored to the screen, y pointing down.
+    const QRect viewport = state.viewportRect();
+    QMatrix4x4 pattern;
+    pattern.scale(1.0f / textureSize.width(), -1.0f / textureSize.height());
+    pattern.scale(0.5f * viewport.width(), 0.5f * viewport.height());
+    p->setUniformValue(m_patternMatrix, pattern);
+
+    p->setUniformValue(m_color, glass.color);
+    p->setUniformValue(m_backgroundColor, glass.backgroundColor);
+    p->setUniformValue(m_centersize, glass.centersize);
+    p->setUniformValue(m_border, glass.border);
+    p->setUniformValue(m_sigma, glass.sigma);
+    p->setUniformValue(m_brightness, glass.brightness);
+    p->setUniformValue(m_size, glass.size);
+    p->setUniformValue(m_dash, glass.dash);
+    p->setUniformValue(m_pattern, 0);
+}

@@ -1,0 +1,147 @@
+#include "declarativeglassitem.h"
+#include "glassitemnode.h"
+#include "glassmaterial.h"
+
+#include <QQmlComponent>
+#include <QQmlEngine>
+#include <QQuickItem>
+#include <QQuickView>
+#include <QtTest>
+
+static int luminance(QRgb pixel)
+{
+    return (qRed(pixel) * 11 + qGreen(pixel) * 16 + qBlue(pixel) * 5) / 32;
+}
+
+class tst_DeclarativeGlassItem : public QObject
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void setterRules();
+    void materialPerRotation();
+    void invalidAngleLeavesNoMaterial();
+    void statesCompareFieldByField();
+    void glowIsBrightestInTheMiddle();
+    void dashesOnlyWhenDashed_data();
+    void dashesOnlyWhenDashed();
+
+private:
+    QImage render(const QByteArray &glass, const QSize &size);
+};
+
+void tst_DeclarativeGlassItem::setterRules()
+{
+    DeclarativeGlassItem glass;
+    QSignalSpy radius(&glass, &DeclarativeGlassItem::radiusChanged);
+    QSignalSpy color(&glass, &DeclarativeGlassItem::colorChanged);
+    QSignalSpy background(&glass, &DeclarativeGlassItem::backgroundColorChanged);
+    QSignalSpy dashLength(&glass, &DeclarativeGlassItem::dashLengthChanged);
+
+    glass.setRadius(DeclarativeGlassItem::DefaultRadius);
+    QCOMPARE(radius.count(), 0);
+    glass.setRadius(0.3f);
+    glass.resetRadius();
+    QCOMPARE(radius.count(), 2);
+    QCOMPARE(glass.radius(), 0.15f);
+
+    // The background colour announces itself as a colour change.
+    glass.setBackgroundColor(Qt::red);
+    QCOMPARE(color.count(), 1);
+    QCOMPARE(background.count(), 0);
+
+    glass.setDashLength(50);
+    QCOMPARE(dashLength.count(), 1);
+    QCOMPARE(glass.defaultFalloffRadius(), 0.15f);
+}
+
+void tst_DeclarativeGlassItem::materialPerRotation()
+{
+    QSet<QSGMaterialType *> types;
+    for (int angle : { 0, 90, 180, 270 }) {
+        GlassItemNode node(angle);
+        QVERIFY(node.glassMaterial());
+        QCOMPARE(node.glassMaterial()->angle(), angle);
+        QVERIFY(node.glassMaterial()->flags() & QSGMaterial::Blending);
+        types.insert(node.glassMaterial()->type());
+    }
+    QCOMPARE(types.size(), 4);
+}
+
+void tst_DeclarativeGlassItem::invalidAngleLeavesNoMaterial()
+{
+    QTest::ignoreMessage(QtWarningMsg, "GlassItemNode: invalid angle 45");
+    GlassItemNode node(45);
+    QVERIFY(!node.material());
+}
+
+void tst_DeclarativeGlassItem::statesCompareFieldByField()
+{
+    GlassMaterial a(0), b(0);
+    a.state().color = b.state().color = Qt::white;
+    QCOMPARE(a.compare(&b), 0);
+    b.state().dash = QVector3D(0, 50, 1);
+    QVERIFY(a.compare(&b) != 0);
+    QCOMPARE(a.compare(&b), -b.compare(&a));
+}
+
+QImage tst_DeclarativeGlassItem::render(const QByteArray &glass, const QSize &size)
+{
+    QQuickView view;
+    view.setColor(Qt::black);
+    QQmlComponent component(view.engine());
+    component.setData("import QtQuick 2.6\nimport Quorvane.Pelkan 1.0\n"
+                      "Item { width: " + QByteArray::number(size.width()) + "; height: " + QByteArray::number(size.height())
+                      + "\n  GlassItem { anchors.fill: parent; " + glass + " } }\n", QUrl());
+    auto root = qobject_cast<QQuickItem *>(component.create());
+    if (!root) {
+        qWarning() << component.errorString();
+        return QImage();
+    }
+    view.setContent(QUrl(), nullptr, root);
+    view.resize(size);
+    view.show();
+    if (!QTest::qWaitForWindowExposed(&view))
+        return QImage();
+    QTest::qWait(100); // the pattern arrives from the image provider
+    return view.grabWindow();
+}
+
+void tst_DeclarativeGlassItem::glowIsBrightestInTheMiddle()
+{
+    const QImage image = render("color: 'white'", QSize(200, 200));
+    QVERIFY(!image.isNull());
+    const int centre = luminance(image.pixel(100, 100));
+    const int edge = luminance(image.pixel(100, 4));
+    const int corner = luminance(image.pixel(3, 3));
+    QVERIFY2(centre > 150, qPrintable(QString::number(centre)));
+    QVERIFY2(centre > edge + 60, qPrintable(QStringLiteral("%1 vs %2").arg(centre).arg(edge)));
+    QVERIFY(corner <= edge);
+}
+
+void tst_DeclarativeGlassItem::dashesOnlyWhenDashed_data()
+{
+    QTest::addColumn<bool>("dashed");
+    QTest::newRow("dashed") << true;
+    QTest::newRow("plain") << false;
+}
+
+void tst_DeclarativeGlassItem::dashesOnlyWhenDashed()
+{
+    QFETCH(bool, dashed);
+    // A stretched glow along a wide strip, sampled along its middle.
+    const QImage image = render("color: 'white'; ratio: 0; dashed: " + QByteArray(dashed ? "true" : "false")
+                                        + "; dashLength: 20; dashMargin: 20",
+                                QSize(400, 60));
+    QVERIFY(!image.isNull());
+    int darkest = 255;
+    for (int x = 60; x < 340; x += 2)
+        darkest = qMin(darkest, luminance(image.pixel(x, 30)));
+    if (dashed)
+        QVERIFY2(darkest < 40, qPrintable(QString::number(darkest)));
+    else
+        QVERIFY2(darkest > 120, qPrintable(QString::number(darkest)));
+}
+
+QTEST_MAIN(tst_DeclarativeGlassItem)
+#include "tst_declarativeglassitem.moc"
