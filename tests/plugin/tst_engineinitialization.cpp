@@ -5,6 +5,7 @@
 #include <QQmlComponent>
 #include <QQmlContext>
 #include <QQmlEngine>
+#include <QQuickImageProvider>
 #include <QTranslator>
 #include <QtTest>
 
@@ -19,6 +20,7 @@ private Q_SLOTS:
     void translatorsInstalledAndRemovedWithEngine();
     void eachEngineInstallsItsOwn();
     void timeZoneUpdaterBelongsToEngine();
+    void themeImageProviderKeptWhenPresent();
     void otherModulesDoNothing_data();
     void otherModulesDoNothing();
 
@@ -88,6 +90,22 @@ void tst_EngineInitialization::timeZoneUpdaterBelongsToEngine()
     const auto updaters = engine->findChildren<TimeZoneUpdater *>(QString(), Qt::FindDirectChildrenOnly);
     QCOMPARE(updaters.size(), 1);
     QCOMPARE(updaters.first()->zoneFile(), QStringLiteral("/etc/localtime"));
+}
+
+void tst_EngineInitialization::themeImageProviderKeptWhenPresent()
+{
+    QScopedPointer<QQmlEngine> fresh(importingEngine());
+    QVERIFY(fresh->imageProvider(QStringLiteral("theme")));
+
+    // An engine that already has a "theme" provider keeps it.
+    QQmlEngine engine;
+    auto own = new QQuickImageProvider(QQuickImageProvider::Image);
+    engine.addImageProvider(QStringLiteral("theme"), own);
+    QQmlComponent component(&engine);
+    component.setData("import QtQml 2.2\nimport Quorvane.Pelkan 1.0\nQtObject {}\n", QUrl());
+    QScopedPointer<QObject> object(component.create());
+    QVERIFY(object);
+    QCOMPARE(engine.imageProvider(QStringLiteral("theme")), own);
 }
 
 void tst_EngineInitialization::otherModulesDoNothing_data()

@@ -152,6 +152,7 @@ void tst_Registration::creatableTypes_data()
     QTest::newRow("Formatter") << QByteArray("Formatter") << QByteArray("DeclarativeFormatter");
     QTest::newRow("PageStackBase") << QByteArray("PageStackBase") << QByteArray("DeclarativePageStackBase");
     QTest::newRow("Cover") << QByteArray("Cover") << QByteArray("DeclarativeCover");
+    QTest::newRow("GlassItem") << QByteArray("GlassItem") << QByteArray("DeclarativeGlassItem");
     QTest::newRow("PreeditText") << QByteArray("Private.PreeditText") << QByteArray("DeclarativePreeditText");
     QTest::newRow("AutoFill") << QByteArray("Private.AutoFill") << QByteArray("AutoFill");
     QTest::newRow("CoverAction") << QByteArray("CoverAction") << QByteArray("DeclarativeCoverAction");

@@ -43,6 +43,28 @@ Flickable {
             }
         }
 
+        SectionHeader { text: "Glass" }
+
+        Row {
+            spacing: Theme.paddingLarge
+            GlassItem { width: Theme.itemSizeMedium; height: width; color: Theme.highlightColor }
+            GlassItem { width: Theme.itemSizeMedium; height: width; color: Theme.highlightColor; dimmed: true }
+            GlassItem { width: Theme.itemSizeMedium; height: width; color: "#ff6f61"; falloffRadius: 0.25 }
+        }
+        GlassItem {
+            width: column.width
+            height: Theme.itemSizeSmall / 2
+            color: Theme.highlightColor
+            ratio: 0
+        }
+        GlassItem {
+            width: column.width
+            height: Theme.itemSizeSmall / 2
+            color: Theme.highlightColor
+            ratio: 0
+            dashed: true
+        }
+
         SectionHeader { text: "Follows the primary colour" }
 
         Row {
