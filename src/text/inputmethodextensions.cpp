@@ -17,7 +17,6 @@ bool isTextEditorClass(const QObject *object)
     return std::strstr(name, "TextInput") || std::strstr(name, "TextEdit");
 }
 
-
 } // namespace
 
 namespace InputMethodExtensions {
