@@ -4,7 +4,6 @@
 #include "themepixels.h"
 
 #include <QImageReader>
-#include <QMutex>
 
 QColor ThemeImageRecord::effectiveColor() const
 {
