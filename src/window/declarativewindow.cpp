@@ -497,6 +497,7 @@ void DeclarativeWindow::enterWindow(QQuickWindow *window)
         m_window->removeEventFilter(this);
     }
     m_window = window;
+    m_publishedSinceShown = false;
     if (!window) {
         // Torn down with its window, or detached on purpose: nothing worth a warning.
         if (parentItem() && !previousDestroyed)
@@ -542,9 +543,12 @@ void DeclarativeWindow::trackScreen(QScreen *screen)
 
 void DeclarativeWindow::updateVisibility(bool visible)
 {
-    // A window gets its native handle when it is first shown.
+    // A window gets its native handle when it is first shown, and a hidden window's
+    // compositor side may be gone when it shows again.
     if (visible)
         publishWindowProperties();
+    else
+        m_publishedSinceShown = false;
     _updateCoverVisibility();
 }
 
@@ -601,8 +605,16 @@ void DeclarativeWindow::aboutToQuit()
 
 bool DeclarativeWindow::eventFilter(QObject *watched, QEvent *event)
 {
-    if (watched == m_window && !m_observers.isEmpty() && isPointerEvent(event->type()))
+    if (watched != m_window)
+        return false;
+    if (!m_observers.isEmpty() && isPointerEvent(event->type())) {
         dispatch(event);
+    } else if (event->type() == QEvent::Expose && !m_publishedSinceShown && m_window->handle()) {
+        // The compositor's side of a window exists once it is first exposed: properties
+        // set before that are lost, so they go out again now.
+        m_publishedSinceShown = true;
+        publishWindowProperties();
+    }
     return false;
 }
 

@@ -181,6 +181,7 @@ private:
     QPointer<QQuickWindow> m_proxyWindow;
     QPointer<QWindow> m_mainWindow;
     QPointer<QQuickWindow> m_window;
+    bool m_publishedSinceShown = false;
     QPointer<QScreen> m_screen;
     float m_windowOpacity = 1.0f;
     QRectF m_backgroundRect;
