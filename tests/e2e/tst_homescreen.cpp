@@ -1,0 +1,244 @@
+#include "homescreensession.h"
+
+#include <QFileInfo>
+#include <QJsonArray>
+#include <QtTest>
+
+#include <cerrno>
+#include <grp.h>
+#include <signal.h>
+#include <unistd.h>
+
+// Applications run under the reference home screen as wayland clients: what they publish
+// is read off the compositor's side of the connection, and what the home screen does
+// (pressing cover actions, announcing cover status, sending keys) is seen in the
+// application's log.
+class tst_HomeScreen : public QObject
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void applicationWindowProperties_data();
+    void applicationWindowProperties();
+    void coverWindowPairsWithApplication_data();
+    void coverWindowPairsWithApplication();
+    void coverActionsEndToEnd();
+    void coverStatusFromHomeScreen();
+    void backKey_data();
+    void backKey();
+    void leavesNoProcessBehind();
+
+private:
+    static QString application() { return QFINDTESTDATA("data/application.qml"); }
+    // Starts a session running the application and waits until both of its windows have
+    // published their properties.
+    bool run(HomeScreenSession &session, const QStringList &properties);
+    static QString name(const QJsonObject &record) { return record.value(QLatin1String("name")).toString(); }
+    static QString value(const QJsonObject &record) { return record.value(QLatin1String("value")).toString(); }
+    static bool privilegedHere();
+};
+
+bool tst_HomeScreen::run(HomeScreenSession &session, const QStringList &properties)
+{
+    if (!session.start() || !session.launch(application(), properties))
+        return false;
+    // The cover window's category closes its publication.
+    return !session.waitFor([](const QJsonObject &r) {
+        return r.value(QLatin1String("event")) == QLatin1String("property") && name(r) == QLatin1String("CATEGORY")
+                && value(r).contains(QLatin1String("cover"));
+    }).isEmpty() && session.surfaceWith(QStringLiteral("BACKGROUND_VISIBLE")) != 0;
+}
+
+bool tst_HomeScreen::privilegedHere()
+{
+    const group *privileged = getgrnam("privileged");
+    return getuid() == 0 || (privileged && getegid() == privileged->gr_gid);
+}
+
+void tst_HomeScreen::applicationWindowProperties_data()
+{
+    QTest::addColumn<bool>("category");
+    QTest::addColumn<QStringList>("expected");
+    QTest::newRow("category") << true << QStringList { "BACKGROUND_VISIBLE", "WINID", "QUORVANE_COVER_WINDOW",
+                                                       "QUORVANE_HAVE_COVER", "CATEGORY", "WINDOW_OPACITY" };
+    QTest::newRow("no category") << false << QStringList { "BACKGROUND_VISIBLE", "WINID", "QUORVANE_COVER_WINDOW",
+                                                           "QUORVANE_HAVE_COVER", "WINDOW_OPACITY" };
+}
+
+void tst_HomeScreen::applicationWindowProperties()
+{
+    QFETCH(bool, category);
+    QFETCH(QStringList, expected);
+    HomeScreenSession session;
+    QVERIFY(run(session, { QStringLiteral("category=%1").arg(category ? "true" : "false") }));
+
+    const int surface = session.surfaceWith(QStringLiteral("BACKGROUND_VISIBLE"));
+    QVERIFY(session.waitForPropertySequence(surface, expected));
+    // Each publication sends the whole set in the same order; the window may publish
+    // more than once (when shown, when its cover arrives). Other properties of the
+    // window (the cover actions, keeping the cover) come on their own.
+    QStringList published;
+    for (const QJsonObject &record : session.properties(surface)) {
+        if (name(record) != QLatin1String("_APP_COVER_ACTION") && name(record) != QLatin1String("QUORVANE_RETAIN_COVER"))
+            published << name(record);
+    }
+    QVERIFY(!published.isEmpty());
+    QCOMPARE(published.size() % expected.size(), 0);
+    for (int i = 0; i < published.size(); i += expected.size())
+        QCOMPARE(published.mid(i, expected.size()), expected);
+
+    const QJsonObject visible = session.lastProperty(surface, QStringLiteral("BACKGROUND_VISIBLE"));
+    QCOMPARE(visible.value(QLatin1String("type")).toString(), QStringLiteral("bool"));
+    QCOMPARE(value(visible), QStringLiteral("true"));
+    QCOMPARE(value(session.lastProperty(surface, QStringLiteral("WINDOW_OPACITY"))), QStringLiteral("1"));
+    QCOMPARE(session.lastProperty(surface, QStringLiteral("WINID")).value(QLatin1String("type")).toString(),
+             QStringLiteral("qulonglong"));
+    if (category)
+        QCOMPARE(value(session.lastProperty(surface, QStringLiteral("CATEGORY"))), QStringLiteral("pelkan"));
+}
+
+void tst_HomeScreen::coverWindowPairsWithApplication_data()
+{
+    QTest::addColumn<bool>("category");
+    QTest::addColumn<QStringList>("expected");
+    QTest::newRow("category") << true << QStringList { "TRANSPARENT", "WINID", "CATEGORY", "QUORVANE_COVER_WINDOW",
+                                                       "QUORVANE_APPLICATION_WINDOW" };
+    QTest::newRow("no category") << false << QStringList { "TRANSPARENT", "WINID", "CATEGORY" };
+}
+
+void tst_HomeScreen::coverWindowPairsWithApplication()
+{
+    QFETCH(bool, category);
+    QFETCH(QStringList, expected);
+    HomeScreenSession session;
+    QVERIFY(run(session, { QStringLiteral("category=%1").arg(category ? "true" : "false") }));
+
+    const int application = session.surfaceWith(QStringLiteral("BACKGROUND_VISIBLE"));
+    const int cover = session.surfaceWith(QStringLiteral("TRANSPARENT"));
+    QVERIFY(cover != 0 && cover != application);
+
+    // Properties set before the compositor's side of a window exists reach it all at
+    // once, sorted by name, when it is made; the window's own publication keeps order.
+    QVERIFY(session.waitForPropertySequence(cover, expected));
+    QCOMPARE(value(session.lastProperty(cover, QStringLiteral("TRANSPARENT"))), QStringLiteral("true"));
+    QCOMPARE(value(session.lastProperty(cover, QStringLiteral("CATEGORY"))),
+             category ? QStringLiteral("pelkan-cover") : QStringLiteral("cover"));
+
+    // Each window names the other by the id the other published as its own.
+    const QString coverId = value(session.lastProperty(cover, QStringLiteral("WINID")));
+    const QString applicationId = value(session.lastProperty(application, QStringLiteral("WINID")));
+    QVERIFY(!coverId.isEmpty() && coverId != applicationId);
+    QCOMPARE(value(session.lastProperty(application, QStringLiteral("QUORVANE_COVER_WINDOW"))), coverId);
+
+    if (category) {
+        QCOMPARE(value(session.lastProperty(cover, QStringLiteral("QUORVANE_COVER_WINDOW"))), coverId);
+        QCOMPARE(value(session.lastProperty(cover, QStringLiteral("QUORVANE_APPLICATION_WINDOW"))), applicationId);
+        const QJsonObject paired = session.waitForEvent(QStringLiteral("paired"));
+        QCOMPARE(paired.value(QLatin1String("application")).toInt(), application);
+        QCOMPARE(paired.value(QLatin1String("cover")).toInt(), cover);
+    } else {
+        QVERIFY(session.lastProperty(cover, QStringLiteral("QUORVANE_APPLICATION_WINDOW")).isEmpty());
+        QVERIFY(session.waitForEvent(QStringLiteral("paired"), 300).isEmpty());
+    }
+}
+
+void tst_HomeScreen::coverActionsEndToEnd()
+{
+    HomeScreenSession session;
+    QVERIFY(run(session, {}));
+
+    const QJsonObject published = session.waitForEvent(QStringLiteral("coverActions"));
+    const QJsonArray actions = published.value(QLatin1String("actions")).toArray();
+    QCOMPARE(actions.size(), 2);
+    QCOMPARE(published.value(QLatin1String("surface")).toInt(), session.surfaceWith(QStringLiteral("BACKGROUND_VISIBLE")));
+    const QString service = actions.at(0).toObject().value(QLatin1String("service")).toString();
+    QVERIFY(service.startsWith(QLatin1String("org.quorvaneos.coveraction.pid")));
+
+    const QStringList lines = value(session.lastProperty(published.value(QLatin1String("surface")).toInt(),
+                                                         QStringLiteral("_APP_COVER_ACTION"))).split(QLatin1Char('\n'));
+    QCOMPARE(lines, QStringList({ service, "trigger", "0", "image://theme/icon-cover-pause",
+                                  service, "trigger", "1", "image://theme/icon-cover-next", "0" }));
+
+    // The home screen presses the second action: the second action fires, and only it.
+    session.send(QStringLiteral("trigger 1"));
+    const QJsonObject reply = session.waitForEvent(QStringLiteral("triggered"));
+    QCOMPARE(reply.value(QLatin1String("index")).toInt(), 1);
+    if (!privilegedHere()) {
+        QCOMPARE(reply.value(QLatin1String("error")).toString(), QStringLiteral("org.freedesktop.DBus.Error.AccessDenied"));
+        QCOMPARE(reply.value(QLatin1String("message")).toString(),
+                 QStringLiteral("PID %1 is not in privileged group").arg(session.homeScreenPid()));
+        QSKIP("the home screen is not privileged here: presses are refused, as they must be");
+    }
+    QCOMPARE(reply.value(QLatin1String("error")).toString(), QString());
+    QVERIFY(session.waitForLog(QStringLiteral("e2e: action 1")));
+    QVERIFY(!session.log().contains(QLatin1String("e2e: action 0")));
+
+    // The first action switches the list off: its entries leave the window.
+    session.send(QStringLiteral("trigger 0"));
+    QVERIFY(session.waitForLog(QStringLiteral("e2e: action 0")));
+    const QJsonObject emptied = session.waitForEvent(QStringLiteral("coverActions"));
+    QCOMPARE(emptied.value(QLatin1String("actions")).toArray().size(), 0);
+    QVERIFY(!emptied.contains(QLatin1String("error")));
+}
+
+void tst_HomeScreen::coverStatusFromHomeScreen()
+{
+    HomeScreenSession session;
+    QVERIFY(run(session, {}));
+    // Let the application's bus connection settle before the signal goes out.
+    QVERIFY(!session.waitForEvent(QStringLiteral("coverActions")).isEmpty());
+
+    session.send(QStringLiteral("coverstatus 7"));
+    session.send(QStringLiteral("coverstatus 2"));
+    QVERIFY(session.waitForLog(QStringLiteral("e2e: cover status 2")));
+    QVERIFY(!session.log().contains(QLatin1String("e2e: cover status 7")));
+}
+
+void tst_HomeScreen::backKey_data()
+{
+    QTest::addColumn<int>("depth");
+    QTest::addColumn<bool>("lowers");
+    QTest::newRow("one page") << 1 << true;
+    QTest::newRow("two pages") << 2 << false;
+}
+
+void tst_HomeScreen::backKey()
+{
+    QFETCH(int, depth);
+    QFETCH(bool, lowers);
+    HomeScreenSession session;
+    QVERIFY(run(session, { QStringLiteral("depth=%1").arg(depth) }));
+    const int application = session.surfaceWith(QStringLiteral("BACKGROUND_VISIBLE"));
+
+    session.send(QStringLiteral("key back"));
+    QCOMPARE(session.waitForEvent(QStringLiteral("keySent")).value(QLatin1String("surface")).toInt(), application);
+    if (lowers) {
+        QCOMPARE(session.waitForEvent(QStringLiteral("lower")).value(QLatin1String("surface")).toInt(), application);
+        QVERIFY(!session.log().contains(QLatin1String("e2e: pop")));
+    } else {
+        QVERIFY(session.waitForLog(QStringLiteral("e2e: pop from depth 2")));
+        // Now one page is left: the next Back lowers the window.
+        QVERIFY(session.waitForEvent(QStringLiteral("lower"), 300).isEmpty());
+        session.send(QStringLiteral("key back"));
+        QCOMPARE(session.waitForEvent(QStringLiteral("lower")).value(QLatin1String("surface")).toInt(), application);
+        QCOMPARE(session.log().count(QLatin1String("e2e: pop")), 1);
+    }
+}
+
+void tst_HomeScreen::leavesNoProcessBehind()
+{
+    QList<qint64> pids;
+    {
+        HomeScreenSession session;
+        QVERIFY(run(session, {}));
+        pids = session.startedPids();
+    }
+    QCOMPARE(pids.size(), 3);
+    for (qint64 pid : qAsConst(pids)) {
+        // Reaped children are gone from the process table.
+        QVERIFY2(::kill(pid_t(pid), 0) == -1 && errno == ESRCH, qPrintable(QString::number(pid)));
+    }
+}
+
+QTEST_GUILESS_MAIN(tst_HomeScreen)
+#include "tst_homescreen.moc"
