@@ -7,106 +7,68 @@
 
 namespace {
 
-int sessionCount = 0;
-
-void finish(QProcess &process)
+QString event(const QJsonObject &record)
 {
-    if (process.state() == QProcess::NotRunning)
-        return;
-    process.terminate();
-    if (!process.waitForFinished(3000)) {
-        process.kill();
-        process.waitForFinished(3000);
-    }
+    return record.value(QLatin1String("event")).toString();
 }
 
 } // namespace
 
-HomeScreenSession::HomeScreenSession()
-    : m_socket(QStringLiteral("pelkan-e2e-%1-%2").arg(QCoreApplication::applicationPid()).arg(++sessionCount))
-{
-}
-
 HomeScreenSession::~HomeScreenSession()
 {
     if (QTest::currentTestFailed()) {
-        qWarning().noquote() << "Application log:\n" << m_log;
         for (const QJsonObject &record : qAsConst(m_records))
             qWarning().noquote() << QJsonDocument(record).toJson(QJsonDocument::Compact);
     }
     stop();
 }
 
-bool HomeScreenSession::start()
+bool HomeScreenSession::start(const QString &qmlFile, const QStringList &properties)
 {
-    m_bus.start(QStringLiteral("dbus-daemon"), { QStringLiteral("--session"), QStringLiteral("--nofork"),
-                                                 QStringLiteral("--print-address") });
-    if (!m_bus.waitForStarted())
-        return false;
-    m_pids << m_bus.processId();
-    QDeadlineTimer deadline(5000);
-    while (!m_bus.canReadLine() && !deadline.hasExpired())
-        m_bus.waitForReadyRead(100);
-    m_busAddress = QString::fromUtf8(m_bus.readLine()).trimmed();
-    if (m_busAddress.isEmpty())
-        return false;
+    static int sessions = 0;
+    const QString socket = QStringLiteral("pelkan-e2e-%1-%2").arg(QCoreApplication::applicationPid()).arg(++sessions);
+    const QString bin = QCoreApplication::applicationDirPath();
 
     QProcessEnvironment environment = QProcessEnvironment::systemEnvironment();
-    environment.insert(QStringLiteral("DBUS_SESSION_BUS_ADDRESS"), m_busAddress);
     environment.insert(QStringLiteral("QT_QPA_PLATFORM"), QStringLiteral("offscreen"));
-    m_homeScreen.setProcessEnvironment(environment);
-    m_homeScreen.setProcessChannelMode(QProcess::ForwardedErrorChannel);
-    QObject::connect(&m_homeScreen, &QProcess::readyReadStandardOutput, [this] { readRecords(); });
-    m_homeScreen.start(QCoreApplication::applicationDirPath() + QStringLiteral("/pelkan-home-screen"),
-                       { QStringLiteral("--socket"), m_socket });
-    if (!m_homeScreen.waitForStarted())
+    m_process.setProcessEnvironment(environment);
+    m_process.setProcessChannelMode(QProcess::ForwardedErrorChannel);
+    QObject::connect(&m_process, &QProcess::readyReadStandardOutput, [this] { readRecords(); });
+    // The bus lives as long as the home screen, which lives as long as the application.
+    m_process.start(QStringLiteral("dbus-run-session"),
+                    QStringList { QStringLiteral("--"), bin + QStringLiteral("/pelkan-home-screen"),
+                                  QStringLiteral("--socket"), socket, QStringLiteral("--"),
+                                  bin + QStringLiteral("/pelkan-qml-runner"), qmlFile } + properties);
+    if (!m_process.waitForStarted())
         return false;
-    m_pids << m_homeScreen.processId();
-    return !waitForEvent(QStringLiteral("ready")).isEmpty();
-}
-
-bool HomeScreenSession::launch(const QString &qmlFile, const QStringList &properties)
-{
-    QProcessEnvironment environment = QProcessEnvironment::systemEnvironment();
-    environment.insert(QStringLiteral("DBUS_SESSION_BUS_ADDRESS"), m_busAddress);
-    environment.insert(QStringLiteral("WAYLAND_DISPLAY"), m_socket);
-    environment.insert(QStringLiteral("QT_QPA_PLATFORM"), QStringLiteral("wayland"));
-    environment.insert(QStringLiteral("QT_WAYLAND_SHELL_INTEGRATION"), QStringLiteral("wl-shell"));
-    environment.insert(QStringLiteral("QT_WAYLAND_DISABLE_WINDOWDECORATION"), QStringLiteral("1"));
-    // The home screen takes no GPU buffers: software GL draws into shared memory.
-    environment.insert(QStringLiteral("LIBGL_ALWAYS_SOFTWARE"), QStringLiteral("1"));
-    environment.remove(QStringLiteral("DISPLAY"));
-    m_application.setProcessEnvironment(environment);
-    m_application.setProcessChannelMode(QProcess::MergedChannels);
-    QObject::connect(&m_application, &QProcess::readyReadStandardOutput, [this] { readLog(); });
-    m_application.start(QCoreApplication::applicationDirPath() + QStringLiteral("/pelkan-qml-runner"),
-                        QStringList { qmlFile } + properties);
-    if (!m_application.waitForStarted())
-        return false;
-    m_pids << m_application.processId();
-    return true;
+    m_homeScreenPid = waitForEvent(QStringLiteral("ready")).value(QLatin1String("pid")).toVariant().toLongLong();
+    m_clientPid = waitForEvent(QStringLiteral("clientStarted")).value(QLatin1String("pid")).toVariant().toLongLong();
+    return m_homeScreenPid && m_clientPid;
 }
 
 void HomeScreenSession::stop()
 {
-    finish(m_application);
-    if (m_homeScreen.state() != QProcess::NotRunning) {
-        send(QStringLiteral("quit"));
-        if (!m_homeScreen.waitForFinished(3000))
-            finish(m_homeScreen);
+    if (m_process.state() == QProcess::NotRunning)
+        return;
+    send(QStringLiteral("quit"));
+    if (m_process.waitForFinished(5000))
+        return;
+    m_process.terminate();
+    if (!m_process.waitForFinished(2000)) {
+        m_process.kill();
+        m_process.waitForFinished(2000);
     }
-    finish(m_bus);
 }
 
 void HomeScreenSession::send(const QString &command)
 {
-    m_homeScreen.write(command.toUtf8() + '\n');
-    m_homeScreen.waitForBytesWritten(1000);
+    m_process.write(command.toUtf8() + '\n');
+    m_process.waitForBytesWritten(1000);
 }
 
 void HomeScreenSession::readRecords()
 {
-    m_pending += m_homeScreen.readAllStandardOutput();
+    m_pending += m_process.readAllStandardOutput();
     int end;
     while ((end = m_pending.indexOf('\n')) >= 0) {
         const QJsonDocument document = QJsonDocument::fromJson(m_pending.left(end));
@@ -116,50 +78,58 @@ void HomeScreenSession::readRecords()
     }
 }
 
-void HomeScreenSession::readLog()
-{
-    m_log += QString::fromUtf8(m_application.readAllStandardOutput());
-}
-
-QJsonObject HomeScreenSession::waitFor(const Predicate &matches, int timeout)
+bool HomeScreenSession::waitUntil(const std::function<bool()> &done, int timeout) const
 {
     QDeadlineTimer deadline(timeout);
-    for (;;) {
-        for (int i = m_seen; i < m_records.size(); ++i) {
-            if (matches(m_records.at(i))) {
-                m_seen = i + 1;
-                return m_records.at(i);
-            }
-        }
-        if (deadline.hasExpired() || m_homeScreen.state() == QProcess::NotRunning)
-            return {};
-        QTest::qWait(10);
-    }
-}
-
-QJsonObject HomeScreenSession::waitForEvent(const QString &event, int timeout)
-{
-    return waitFor([&event](const QJsonObject &record) { return record.value(QLatin1String("event")).toString() == event; },
-                   timeout);
-}
-
-bool HomeScreenSession::waitForLog(const QString &text, int timeout)
-{
-    QDeadlineTimer deadline(timeout);
-    while (!m_log.contains(text)) {
-        if (deadline.hasExpired())
+    while (!done()) {
+        if (deadline.hasExpired() || m_process.state() == QProcess::NotRunning)
             return false;
         QTest::qWait(10);
     }
     return true;
 }
 
+QJsonObject HomeScreenSession::waitFor(const Predicate &matches, int timeout)
+{
+    QJsonObject found;
+    waitUntil([&] {
+        for (int i = m_seen; i < m_records.size(); ++i) {
+            if (matches(m_records.at(i))) {
+                m_seen = i + 1;
+                found = m_records.at(i);
+                return true;
+            }
+        }
+        return false;
+    }, timeout);
+    return found;
+}
+
+QJsonObject HomeScreenSession::waitForEvent(const QString &name, int timeout)
+{
+    return waitFor([&name](const QJsonObject &record) { return event(record) == name; }, timeout);
+}
+
+bool HomeScreenSession::waitForLog(const QString &text, int timeout) const
+{
+    return waitUntil([&] { return log().contains(text); }, timeout);
+}
+
+QString HomeScreenSession::log() const
+{
+    QString text;
+    for (const QJsonObject &record : m_records) {
+        if (event(record) == QLatin1String("log"))
+            text += record.value(QLatin1String("text")).toString() + QLatin1Char('\n');
+    }
+    return text;
+}
+
 QVector<QJsonObject> HomeScreenSession::properties(int surface) const
 {
     QVector<QJsonObject> result;
     for (const QJsonObject &record : m_records) {
-        if (record.value(QLatin1String("event")).toString() == QLatin1String("property")
-                && record.value(QLatin1String("surface")).toInt() == surface)
+        if (event(record) == QLatin1String("property") && record.value(QLatin1String("surface")).toInt() == surface)
             result.append(record);
     }
     return result;
@@ -167,21 +137,16 @@ QVector<QJsonObject> HomeScreenSession::properties(int surface) const
 
 bool HomeScreenSession::waitForPropertySequence(int surface, const QStringList &names, int timeout) const
 {
-    QDeadlineTimer deadline(timeout);
-    for (;;) {
-        const QVector<QJsonObject> received = properties(surface);
+    return waitUntil([&] {
+        QStringList received;
+        for (const QJsonObject &record : properties(surface))
+            received << record.value(QLatin1String("name")).toString();
         for (int start = 0; start + names.size() <= received.size(); ++start) {
-            int matched = 0;
-            while (matched < names.size()
-                   && received.at(start + matched).value(QLatin1String("name")).toString() == names.at(matched))
-                ++matched;
-            if (matched == names.size())
+            if (received.mid(start, names.size()) == names)
                 return true;
         }
-        if (deadline.hasExpired())
-            return false;
-        QTest::qWait(10);
-    }
+        return false;
+    }, timeout);
 }
 
 QJsonObject HomeScreenSession::lastProperty(int surface, const QString &name) const
@@ -197,8 +162,7 @@ QJsonObject HomeScreenSession::lastProperty(int surface, const QString &name) co
 int HomeScreenSession::surfaceWith(const QString &propertyName) const
 {
     for (const QJsonObject &record : m_records) {
-        if (record.value(QLatin1String("event")).toString() == QLatin1String("property")
-                && record.value(QLatin1String("name")).toString() == propertyName)
+        if (event(record) == QLatin1String("property") && record.value(QLatin1String("name")).toString() == propertyName)
             return record.value(QLatin1String("surface")).toInt();
     }
     return 0;

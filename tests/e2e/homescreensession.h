@@ -7,23 +7,20 @@
 
 #include <functional>
 
-// One run of an application under the reference home screen: a private session bus, the
-// home screen on a private Wayland socket, and the application as a wayland client. It
-// collects the home screen's records and the application's log, and stops everything it
-// started when it goes away.
+// One run of an application under the reference home screen, on a private session bus
+// and a private Wayland socket. It collects the home screen's records (the application's
+// log among them) and ends everything it started when it goes away.
 class HomeScreenSession
 {
 public:
     using Predicate = std::function<bool(const QJsonObject &)>;
 
-    HomeScreenSession();
     ~HomeScreenSession();
 
-    // Starts the bus and the home screen; false when either does not come up.
-    bool start();
-    // Runs the QML file with the given root properties ("name=value").
-    bool launch(const QString &qmlFile, const QStringList &properties = {});
-    // Stops the application, the home screen and the bus, in that order.
+    // Runs the QML file with the given root properties ("name=value"); false when the
+    // home screen or the application does not come up.
+    bool start(const QString &qmlFile, const QStringList &properties = {});
+    // Ends the application, then the home screen and its bus.
     void stop();
 
     void send(const QString &command);
@@ -33,10 +30,9 @@ public:
     QJsonObject waitFor(const Predicate &matches, int timeout = 10000);
     QJsonObject waitForEvent(const QString &event, int timeout = 10000);
     // Waits for the application to log a line containing text.
-    bool waitForLog(const QString &text, int timeout = 10000);
+    bool waitForLog(const QString &text, int timeout = 10000) const;
+    QString log() const;
 
-    QVector<QJsonObject> records() const { return m_records; }
-    QString log() const { return m_log; }
     // The properties of one surface in the order they arrived.
     QVector<QJsonObject> properties(int surface) const;
     // Waits until the surface received these properties one right after the other.
@@ -46,21 +42,18 @@ public:
     // The surface that carried a property of this name first, or 0.
     int surfaceWith(const QString &propertyName) const;
 
-    qint64 homeScreenPid() const { return m_homeScreen.processId(); }
-    QList<qint64> startedPids() const { return m_pids; }
+    qint64 homeScreenPid() const { return m_homeScreenPid; }
+    // The bus runner, the home screen and the application.
+    QList<qint64> startedPids() const { return { m_process.processId(), m_homeScreenPid, m_clientPid }; }
 
 private:
+    bool waitUntil(const std::function<bool()> &done, int timeout) const;
     void readRecords();
-    void readLog();
 
-    QProcess m_bus;
-    QProcess m_homeScreen;
-    QProcess m_application;
-    QString m_busAddress;
-    QString m_socket;
+    QProcess m_process;
     QByteArray m_pending;
     QVector<QJsonObject> m_records;
     int m_seen = 0;
-    QString m_log;
-    QList<qint64> m_pids;
+    qint64 m_homeScreenPid = 0;
+    qint64 m_clientPid = 0;
 };

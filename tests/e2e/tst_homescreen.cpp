@@ -1,6 +1,5 @@
 #include "homescreensession.h"
 
-#include <QFileInfo>
 #include <QJsonArray>
 #include <QtTest>
 
@@ -40,7 +39,7 @@ private:
 
 bool tst_HomeScreen::run(HomeScreenSession &session, const QStringList &properties)
 {
-    if (!session.start() || !session.launch(application(), properties))
+    if (!session.start(application(), properties))
         return false;
     // The cover window's category closes its publication.
     return !session.waitFor([](const QJsonObject &r) {
@@ -57,20 +56,21 @@ bool tst_HomeScreen::privilegedHere()
 
 void tst_HomeScreen::applicationWindowProperties_data()
 {
-    QTest::addColumn<bool>("category");
+    QTest::addColumn<QStringList>("properties");
     QTest::addColumn<QStringList>("expected");
-    QTest::newRow("category") << true << QStringList { "BACKGROUND_VISIBLE", "WINID", "QUORVANE_COVER_WINDOW",
-                                                       "QUORVANE_HAVE_COVER", "CATEGORY", "WINDOW_OPACITY" };
-    QTest::newRow("no category") << false << QStringList { "BACKGROUND_VISIBLE", "WINID", "QUORVANE_COVER_WINDOW",
-                                                           "QUORVANE_HAVE_COVER", "WINDOW_OPACITY" };
+    const QStringList common { "BACKGROUND_VISIBLE", "WINID", "QUORVANE_COVER_WINDOW", "QUORVANE_HAVE_COVER" };
+    QTest::newRow("category") << QStringList { "category=true" } << common + QStringList { "CATEGORY", "WINDOW_OPACITY" };
+    QTest::newRow("no category") << QStringList { "category=false" } << common + QStringList { "WINDOW_OPACITY" };
+    QTest::newRow("background rectangle") << QStringList { "category=false", "backgroundHeight=50" }
+                                          << common + QStringList { "WINDOW_OPACITY", "BACKGROUND_RECT" };
 }
 
 void tst_HomeScreen::applicationWindowProperties()
 {
-    QFETCH(bool, category);
+    QFETCH(QStringList, properties);
     QFETCH(QStringList, expected);
     HomeScreenSession session;
-    QVERIFY(run(session, { QStringLiteral("category=%1").arg(category ? "true" : "false") }));
+    QVERIFY(run(session, properties));
 
     const int surface = session.surfaceWith(QStringLiteral("BACKGROUND_VISIBLE"));
     QVERIFY(session.waitForPropertySequence(surface, expected));
@@ -82,7 +82,6 @@ void tst_HomeScreen::applicationWindowProperties()
         if (name(record) != QLatin1String("_APP_COVER_ACTION") && name(record) != QLatin1String("QUORVANE_RETAIN_COVER"))
             published << name(record);
     }
-    QVERIFY(!published.isEmpty());
     QCOMPARE(published.size() % expected.size(), 0);
     for (int i = 0; i < published.size(); i += expected.size())
         QCOMPARE(published.mid(i, expected.size()), expected);
@@ -93,8 +92,10 @@ void tst_HomeScreen::applicationWindowProperties()
     QCOMPARE(value(session.lastProperty(surface, QStringLiteral("WINDOW_OPACITY"))), QStringLiteral("1"));
     QCOMPARE(session.lastProperty(surface, QStringLiteral("WINID")).value(QLatin1String("type")).toString(),
              QStringLiteral("qulonglong"));
-    if (category)
+    if (expected.contains(QLatin1String("CATEGORY")))
         QCOMPARE(value(session.lastProperty(surface, QStringLiteral("CATEGORY"))), QStringLiteral("pelkan"));
+    if (expected.contains(QLatin1String("BACKGROUND_RECT")))
+        QCOMPARE(value(session.lastProperty(surface, QStringLiteral("BACKGROUND_RECT"))), QStringLiteral("0,10,270,50"));
 }
 
 void tst_HomeScreen::coverWindowPairsWithApplication_data()
@@ -233,8 +234,8 @@ void tst_HomeScreen::leavesNoProcessBehind()
         QVERIFY(run(session, {}));
         pids = session.startedPids();
     }
-    QCOMPARE(pids.size(), 3);
     for (qint64 pid : qAsConst(pids)) {
+        QVERIFY(pid > 0);
         // Reaped children are gone from the process table.
         QVERIFY2(::kill(pid_t(pid), 0) == -1 && errno == ESRCH, qPrintable(QString::number(pid)));
     }

@@ -3,7 +3,6 @@
 #include "declarativecoverwindow.h"
 #include "declarativewindow.h"
 #include "theme.h"
-#include "windowpropertypublisher.h"
 
 #include <QDBusConnection>
 #include <QDBusMessage>
@@ -11,18 +10,11 @@
 
 #include <cmath>
 
-struct Published {
-    QString name;
-    QVariant value;
-};
-
 class tst_DeclarativeCover : public QObject
 {
     Q_OBJECT
 
 private Q_SLOTS:
-    void cleanup() { WindowPropertyPublisher::setSinkForTesting({}); }
-
     void statusFromHomeScreen_data();
     void statusFromHomeScreen();
     void sameStatusTwiceEmitsOnce();
@@ -31,7 +23,7 @@ private Q_SLOTS:
     void actionArea();
     void actionAreaFollowsHeight();
     void coverWindowWithoutAlphaIsBlack();
-    void coverWindowPairsWithApplicationWindow();
+    void coverWindowFollowsApplicationWindow();
 
 private:
     static void sendStatus(int status)
@@ -149,50 +141,23 @@ void tst_DeclarativeCover::coverWindowWithoutAlphaIsBlack()
     QQuickWindow::setDefaultAlphaBuffer(false);
 }
 
-void tst_DeclarativeCover::coverWindowPairsWithApplicationWindow()
+void tst_DeclarativeCover::coverWindowFollowsApplicationWindow()
 {
-    QVector<Published> published;
-    WindowPropertyPublisher::setSinkForTesting([&published](QWindow *, const QString &name, const QVariant &value) {
-        published.append({ name, value });
-    }, QStringLiteral("wayland"));
     QQuickWindow::setDefaultAlphaBuffer(true);
     DeclarativeCoverWindow coverWindow;
     QQuickWindow::setDefaultAlphaBuffer(false);
     auto cover = new DeclarativeCover(coverWindow.contentItem());
-    cover->setTransparent(true);
     coverWindow.show();
     QVERIFY(QTest::qWaitForWindowExposed(&coverWindow));
     QCOMPARE(coverWindow.cover(), cover);
     QCOMPARE(coverWindow.windowReference(), QStringLiteral("__winref:%1").arg(coverWindow.winId()));
 
-    // Alone: a plain cover.
-    published.clear();
-    coverWindow.publishWindowProperties();
-    QStringList names;
-    for (const Published &p : qAsConst(published))
-        names << p.name;
-    QCOMPARE(names, QStringList({ "TRANSPARENT", "WINID", "CATEGORY" }));
-    QCOMPARE(published.at(0).value, QVariant(true));
-    QCOMPARE(published.at(2).value, QVariant(QStringLiteral("cover")));
-
-    // Attached to an application window that publishes its category.
     QQuickWindow main;
     auto applicationWindow = new DeclarativeWindow(main.contentItem());
-    applicationWindow->setPublishCategory(true);
     main.show();
     QVERIFY(QTest::qWaitForWindowExposed(&main));
     applicationWindow->_setCover(&coverWindow);
     QCOMPARE(coverWindow.mainWindow(), applicationWindow);
-
-    published.clear();
-    coverWindow.publishWindowProperties();
-    names.clear();
-    for (const Published &p : qAsConst(published))
-        names << p.name;
-    QCOMPARE(names, QStringList({ "TRANSPARENT", "WINID", "CATEGORY", "QUORVANE_COVER_WINDOW", "QUORVANE_APPLICATION_WINDOW" }));
-    QCOMPARE(published.at(2).value, QVariant(QStringLiteral("pelkan-cover")));
-    QCOMPARE(published.at(3).value.toULongLong(), qulonglong(coverWindow.winId()));
-    QCOMPARE(published.at(4).value.toULongLong(), qulonglong(main.winId()));
 
     // The cover is shown while the application window is away.
     main.hide();

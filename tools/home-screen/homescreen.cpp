@@ -3,6 +3,7 @@
 #include "extendedsurface.h"
 #include "surfaceextension.h"
 
+#include <QCoreApplication>
 #include <QDBusConnection>
 #include <QDBusMessage>
 #include <QDBusPendingCallWatcher>
@@ -89,8 +90,24 @@ bool HomeScreen::start()
     if (!QDBusConnection::sessionBus().isConnected())
         m_recorder.record(QStringLiteral("error"), { { QStringLiteral("message"), QStringLiteral("no session bus") } });
 
-    m_recorder.record(QStringLiteral("ready"), { { QStringLiteral("socket"), QString::fromUtf8(m_compositor.socketName()) } });
+    m_recorder.record(QStringLiteral("ready"), { { QStringLiteral("socket"), QString::fromUtf8(m_compositor.socketName()) },
+                                                 { QStringLiteral("pid"), QCoreApplication::applicationPid() } });
     return true;
+}
+
+void HomeScreen::launch(const QStringList &command)
+{
+    connect(&m_client, &ClientLauncher::started, this, [this](qint64 pid) {
+        m_recorder.record(QStringLiteral("clientStarted"), { { QStringLiteral("pid"), pid } });
+    });
+    connect(&m_client, &ClientLauncher::logged, this, [this](const QString &line) {
+        m_recorder.record(QStringLiteral("log"), { { QStringLiteral("text"), line } });
+    });
+    connect(&m_client, &ClientLauncher::finished, this, [this](int exitCode) {
+        m_recorder.record(QStringLiteral("clientExited"), { { QStringLiteral("code"), exitCode } });
+        Q_EMIT quitRequested();
+    });
+    m_client.start(QString::fromUtf8(m_compositor.socketName()), command);
 }
 
 // Surfaces ------------------------------------------------------------------------------
@@ -238,6 +255,7 @@ void HomeScreen::handleCommand(const QString &line)
     } else if (command == QLatin1String("coverstatus") && ok) {
         sendCoverStatus(argument);
     } else if (command == QLatin1String("quit")) {
+        m_client.stop();
         Q_EMIT quitRequested();
     } else {
         m_recorder.record(QStringLiteral("error"), { { QStringLiteral("message"), QStringLiteral("unknown command: ") + line } });

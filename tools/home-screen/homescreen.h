@@ -1,5 +1,6 @@
 #pragma once
 
+#include "clientlauncher.h"
 #include "recorder.h"
 
 #include <QHash>
@@ -29,6 +30,9 @@ public:
 
     // Opens the socket; false (with the reason recorded) when that fails.
     bool start();
+
+    // Runs an application as a client; the home screen ends with it.
+    void launch(const QStringList &command);
 
     // "key back", "trigger <index>", "coverstatus <status>", "quit".
     void handleCommand(const QString &line);
@@ -66,4 +70,5 @@ private:
     QTimer m_frameTimer;
     QSet<QPair<int, int>> m_pairs;
     QString m_coverActions;
+    ClientLauncher m_client;
 };

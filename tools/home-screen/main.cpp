@@ -1,10 +1,11 @@
 // A reference home screen for running applications under a real compositor: a headless
 // Wayland compositor that records what applications publish, and acts on commands.
 //
-//   pelkan-home-screen [--socket NAME]
+//   pelkan-home-screen [--socket NAME] [-- COMMAND [ARGUMENT...]]
 //
-// Clients connect with WAYLAND_DISPLAY=NAME, QT_QPA_PLATFORM=wayland and
-// QT_WAYLAND_SHELL_INTEGRATION=wl-shell. Records are JSON lines on standard output;
+// With a command, the home screen runs it as its client, records what it logs, and ends
+// when it ends. Other clients connect with WAYLAND_DISPLAY=NAME, QT_QPA_PLATFORM=wayland
+// and QT_WAYLAND_SHELL_INTEGRATION=wl-shell. Records are JSON lines on standard output;
 // commands are lines on standard input: "key back", "trigger <index>",
 // "coverstatus <status>", "quit". End of input also quits.
 
@@ -29,12 +30,16 @@ int main(int argc, char *argv[])
     QCommandLineOption socket(QStringLiteral("socket"), QStringLiteral("Wayland socket name."), QStringLiteral("name"),
                               QStringLiteral("pelkan-home-screen-%1").arg(QCoreApplication::applicationPid()));
     parser.addOption(socket);
+    parser.addPositionalArgument(QStringLiteral("command"), QStringLiteral("An application to run under the home screen."),
+                                 QStringLiteral("[-- command [argument...]]"));
     parser.process(app);
 
     HomeScreen home(parser.value(socket).toUtf8());
     if (!home.start())
         return 1;
-    QObject::connect(&home, &HomeScreen::quitRequested, &app, &QCoreApplication::quit);
+    QObject::connect(&home, &HomeScreen::quitRequested, &app, &QCoreApplication::quit, Qt::QueuedConnection);
+    if (!parser.positionalArguments().isEmpty())
+        home.launch(parser.positionalArguments());
 
     QSocketNotifier input(STDIN_FILENO, QSocketNotifier::Read);
     QByteArray pending;

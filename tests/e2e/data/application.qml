@@ -9,6 +9,7 @@ Window {
     id: root
     property bool category: true
     property int depth: 2
+    property int backgroundHeight: 0
 
     width: 270
     height: 480
@@ -19,6 +20,7 @@ Window {
         anchors.fill: parent
         focus: true
         _publishCategory: root.category
+        _backgroundRect: Qt.rect(0, 10, root.width, root.backgroundHeight)
         // Keep the cover on show while the application is in front.
         _coverIsPrimaryWindow: true
 
