@@ -210,6 +210,8 @@ void tst_HomeScreen::backKey()
     HomeScreenSession session;
     QVERIFY(run(session, { QStringLiteral("depth=%1").arg(depth) }));
     const int application = session.surfaceWith(QStringLiteral("BACKGROUND_VISIBLE"));
+    session.send(QStringLiteral("focus"));
+    QVERIFY(session.waitForLog(QStringLiteral("e2e: active true")));
 
     session.send(QStringLiteral("key back"));
     QCOMPARE(session.waitForEvent(QStringLiteral("keySent")).value(QLatin1String("surface")).toInt(), application);

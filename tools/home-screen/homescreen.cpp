@@ -63,7 +63,11 @@ HomeScreen::HomeScreen(const QByteArray &socketName, QObject *parent)
     connect(&m_frameTimer, &QTimer::timeout, this, &HomeScreen::sendFrameCallbacks);
 }
 
-HomeScreen::~HomeScreen() = default;
+HomeScreen::~HomeScreen()
+{
+    // Extensions are not owned by their compositor; they go while it is still whole.
+    delete m_shell;
+}
 
 bool HomeScreen::start()
 {
@@ -248,7 +252,9 @@ void HomeScreen::handleCommand(const QString &line)
     bool ok = words.size() == 2;
     const int argument = ok ? words.at(1).toInt(&ok) : 0;
 
-    if (command == QLatin1String("key") && words.value(1) == QLatin1String("back")) {
+    if (command == QLatin1String("focus")) {
+        focusApplication();
+    } else if (command == QLatin1String("key") && words.value(1) == QLatin1String("back")) {
         sendBackKey();
     } else if (command == QLatin1String("trigger") && ok) {
         triggerCoverAction(argument);
@@ -262,27 +268,32 @@ void HomeScreen::handleCommand(const QString &line)
     }
 }
 
-void HomeScreen::sendBackKey()
+bool HomeScreen::focusApplication()
 {
     ExtendedSurface *target = applicationSurface();
     QWaylandSeat *seat = m_compositor.defaultSeat();
     if (!target || !seat) {
-        m_recorder.record(QStringLiteral("error"), { { QStringLiteral("message"), QStringLiteral("no window for the key") } });
-        return;
+        m_recorder.record(QStringLiteral("error"), { { QStringLiteral("message"), QStringLiteral("no window to focus") } });
+        return false;
     }
-    QPointer<QWaylandSurface> surface = target->surface();
-    const bool focusChanged = seat->keyboardFocus() != surface;
-    if (focusChanged)
-        seat->setKeyboardFocus(surface);
-    // Let the window take the focus before the key arrives.
-    QTimer::singleShot(focusChanged ? 100 : 0, this, [this, surface, seat] {
-        if (!surface)
-            return;
-        seat->sendKeyEvent(Qt::Key_Back, true);
-        seat->sendKeyEvent(Qt::Key_Back, false);
-        m_recorder.record(QStringLiteral("keySent"), { { QStringLiteral("surface"), numberOf(surface) },
-                                                       { QStringLiteral("key"), QStringLiteral("back") } });
-    });
+    if (seat->keyboardFocus() != target->surface()) {
+        seat->setKeyboardFocus(target->surface());
+        m_recorder.record(QStringLiteral("focused"), { { QStringLiteral("surface"), numberOf(target->surface()) } });
+    }
+    return true;
+}
+
+void HomeScreen::sendBackKey()
+{
+    // A window takes keys once it knows it is active: focus it first ("focus") and
+    // wait for that, or the first key may arrive before.
+    if (!focusApplication())
+        return;
+    QWaylandSeat *seat = m_compositor.defaultSeat();
+    seat->sendKeyEvent(Qt::Key_Back, true);
+    seat->sendKeyEvent(Qt::Key_Back, false);
+    m_recorder.record(QStringLiteral("keySent"), { { QStringLiteral("surface"), numberOf(seat->keyboardFocus()) },
+                                                   { QStringLiteral("key"), QStringLiteral("back") } });
 }
 
 void HomeScreen::triggerCoverAction(int index)

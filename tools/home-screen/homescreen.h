@@ -34,7 +34,7 @@ public:
     // Runs an application as a client; the home screen ends with it.
     void launch(const QStringList &command);
 
-    // "key back", "trigger <index>", "coverstatus <status>", "quit".
+    // "focus", "key back", "trigger <index>", "coverstatus <status>", "quit".
     void handleCommand(const QString &line);
 
 Q_SIGNALS:
@@ -49,6 +49,7 @@ private:
     void updatePairs();
     void sendFrameCallbacks();
 
+    bool focusApplication();
     void sendBackKey();
     void triggerCoverAction(int index);
     void sendCoverStatus(int status);

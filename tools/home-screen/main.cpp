@@ -6,8 +6,9 @@
 // With a command, the home screen runs it as its client, records what it logs, and ends
 // when it ends. Other clients connect with WAYLAND_DISPLAY=NAME, QT_QPA_PLATFORM=wayland
 // and QT_WAYLAND_SHELL_INTEGRATION=wl-shell. Records are JSON lines on standard output;
-// commands are lines on standard input: "key back", "trigger <index>",
-// "coverstatus <status>", "quit". End of input also quits.
+// commands are lines on standard input: "focus" (the newest application window gets the
+// keyboard), "key back", "trigger <index>", "coverstatus <status>", "quit". End of input
+// also quits.
 
 #include "homescreen.h"
 

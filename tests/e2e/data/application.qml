@@ -14,6 +14,7 @@ Window {
     width: 270
     height: 480
     visible: true
+    onActiveChanged: console.log("e2e: active " + active)
 
     Private.Window {
         id: applicationWindow
