@@ -3,9 +3,11 @@
 #include "translator.h"
 
 #include "coreregistration.h"
+#include "backgroundimageprovider.h"
 #include "declarativeimageprovider.h"
 #include "screen.h"
 #include "timezoneupdater.h"
+#include "transientimageprovider.h"
 
 #include <QCoreApplication>
 #include <QLocale>
@@ -52,6 +54,9 @@ void QuorvanePelkanPlugin::initializeEngine(QQmlEngine *engine, const char *uri)
     Pelkan::Private::initializeEngine(engine, uri);
     if (!engine->imageProvider(QStringLiteral("theme")))
         engine->addImageProvider(QStringLiteral("theme"), new DeclarativeImageProvider);
+    if (!engine->imageProvider(QStringLiteral("transientimage")))
+        engine->addImageProvider(QStringLiteral("transientimage"), new TransientImageProvider);
+    engine->addImageProvider(QStringLiteral("pelkan-background"), new BackgroundImageProvider);
 
     QQmlContext *context = engine->rootContext();
     context->setContextProperty(QStringLiteral("screen"), Pelkan::Screen::instance());

@@ -20,7 +20,8 @@ private Q_SLOTS:
     void translatorsInstalledAndRemovedWithEngine();
     void eachEngineInstallsItsOwn();
     void timeZoneUpdaterBelongsToEngine();
-    void themeImageProviderKeptWhenPresent();
+    void imageProviders_data();
+    void imageProviders();
     void otherModulesDoNothing_data();
     void otherModulesDoNothing();
 
@@ -92,20 +93,33 @@ void tst_EngineInitialization::timeZoneUpdaterBelongsToEngine()
     QCOMPARE(updaters.first()->zoneFile(), QStringLiteral("/etc/localtime"));
 }
 
-void tst_EngineInitialization::themeImageProviderKeptWhenPresent()
+void tst_EngineInitialization::imageProviders_data()
 {
-    QScopedPointer<QQmlEngine> fresh(importingEngine());
-    QVERIFY(fresh->imageProvider(QStringLiteral("theme")));
+    QTest::addColumn<QString>("id");
+    QTest::addColumn<bool>("kept");
+    QTest::newRow("theme") << "theme" << true;
+    QTest::newRow("transientimage") << "transientimage" << true;
+    QTest::newRow("pelkan-background") << "pelkan-background" << false;
+}
 
-    // An engine that already has a "theme" provider keeps it.
+void tst_EngineInitialization::imageProviders()
+{
+    QFETCH(QString, id);
+    QFETCH(bool, kept);
+    QScopedPointer<QQmlEngine> fresh(importingEngine());
+    QVERIFY(fresh->imageProvider(id));
+
+    // An engine that already has the provider keeps it, except for the background one,
+    // which is installed every time.
     QQmlEngine engine;
     auto own = new QQuickImageProvider(QQuickImageProvider::Image);
-    engine.addImageProvider(QStringLiteral("theme"), own);
+    engine.addImageProvider(id, own);
     QQmlComponent component(&engine);
     component.setData("import QtQml 2.2\nimport Quorvane.Pelkan 1.0\nQtObject {}\n", QUrl());
     QScopedPointer<QObject> object(component.create());
     QVERIFY(object);
-    QCOMPARE(engine.imageProvider(QStringLiteral("theme")), own);
+    QCOMPARE(engine.imageProvider(id) == own, kept);
+    QVERIFY(engine.imageProvider(id));
 }
 
 void tst_EngineInitialization::otherModulesDoNothing_data()

@@ -1,0 +1,96 @@
+#include "tolothumbnailcache.h"
+#include "pelkanlogging.h"
+
+#include <QCryptographicHash>
+#include <QDir>
+#include <QFileInfo>
+#include <QImageReader>
+#include <QSaveFile>
+
+ToloThumbnailCache::ToloThumbnailCache(const QString &cacheDirectory)
+    : m_directory(cacheDirectory)
+{
+}
+
+ToloThumbnailCache::~ToloThumbnailCache() = default;
+
+QString ToloThumbnailCache::cachePath(const QString &source, const QSize &size, bool crop) const
+{
+    const QByteArray key = QCryptographicHash::hash(QFileInfo(source).absoluteFilePath().toUtf8(), QCryptographicHash::Sha1).toHex();
+    return QStringLiteral("%1/%2-%3x%4%5.png")
+            .arg(m_directory, QString::fromLatin1(key))
+            .arg(size.width())
+            .arg(size.height())
+            .arg(crop ? QStringLiteral("-crop") : QString());
+}
+
+ToloThumbnailCache::ThumbnailData ToloThumbnailCache::requestThumbnail(const QString &source, const QSize &size,
+                                                                       bool crop, bool unbounded)
+{
+    const QString path = cachePath(source, size, crop);
+    const QFileInfo cached(path);
+    const QFileInfo original(source);
+    if (cached.exists() && original.exists() && cached.lastModified() >= original.lastModified()) {
+        QImage image(path);
+        if (!image.isNull())
+            return { path, image };
+        // A damaged entry is made again below.
+    }
+    return generateThumbnail(source, path, size, crop, unbounded);
+}
+
+ToloThumbnailCache::ThumbnailData ToloThumbnailCache::generateThumbnail(const QString &source, const QString &cachePath,
+                                                                        const QSize &size, bool crop, bool unbounded)
+{
+    const QImage image = readImageThumbnail(source, size, crop, unbounded);
+    if (image.isNull())
+        return {};
+    return { writeCacheFile(cachePath, image), image };
+}
+
+QImage ToloThumbnailCache::readImageThumbnail(const QString &source, const QSize &size, bool crop, bool unbounded)
+{
+    QImageReader reader(source);
+    reader.setAutoTransform(true);
+    QSize natural = reader.size();
+    if (!natural.isValid()) {
+        qCWarning(lcPelkanCoreLog) << "Thumbnail: cannot read" << source << ":" << reader.errorString();
+        return {};
+    }
+    if (reader.transformation() & QImageIOHandler::TransformationRotate90)
+        natural.transpose();
+
+    QSize target = size;
+    if (target.width() <= 0 && target.height() <= 0)
+        target = natural;
+    else if (target.width() <= 0)
+        target.setWidth(qMax(1, qRound(qreal(natural.width()) * target.height() / natural.height())));
+    else if (target.height() <= 0)
+        target.setHeight(qMax(1, qRound(qreal(natural.height()) * target.width() / natural.width())));
+    if (!unbounded && (target.width() > natural.width() || target.height() > natural.height()))
+        target.scale(natural, Qt::KeepAspectRatio);
+
+    const QSize scaled = natural.scaled(target, crop ? Qt::KeepAspectRatioByExpanding : Qt::KeepAspectRatio);
+    QImage image = reader.read();
+    if (image.isNull()) {
+        qCWarning(lcPelkanCoreLog) << "Thumbnail: cannot read" << source << ":" << reader.errorString();
+        return {};
+    }
+    image = image.scaled(scaled, Qt::IgnoreAspectRatio, Qt::SmoothTransformation);
+    if (crop && image.size() != target) {
+        const QRect middle(QPoint((image.width() - target.width()) / 2, (image.height() - target.height()) / 2), target);
+        image = image.copy(middle);
+    }
+    return image;
+}
+
+QString ToloThumbnailCache::writeCacheFile(const QString &path, const QImage &image)
+{
+    QDir().mkpath(QFileInfo(path).absolutePath());
+    QSaveFile file(path);
+    if (!file.open(QIODevice::WriteOnly) || !image.save(&file, "PNG") || !file.commit()) {
+        qCWarning(lcPelkanCoreLog) << "Thumbnail: cannot write" << path << ":" << file.errorString();
+        return QString();
+    }
+    return path;
+}

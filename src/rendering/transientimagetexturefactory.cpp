@@ -1,0 +1,49 @@
+#include "transientimagetexturefactory.h"
+#include "pelkanlogging.h"
+
+#include <QImageReader>
+#include <QQuickWindow>
+
+TransientImageTextureFactory::TransientImageTextureFactory(const QString &path, const QSize &requestedSize)
+    : m_path(path)
+    , m_requestedSize(requestedSize)
+{
+}
+
+bool TransientImageTextureFactory::dropsDecodedImages()
+{
+    static const bool drop = qEnvironmentVariableIsSet("QSG_TRANSIENT_IMAGES");
+    return drop;
+}
+
+void TransientImageTextureFactory::decode() const
+{
+    QImageReader reader(m_path);
+    if (m_requestedSize.width() > 0 && m_requestedSize.height() > 0)
+        reader.setScaledSize(m_requestedSize);
+    m_image = reader.read();
+    m_size = m_image.size();
+    // An unreadable file is reported once, not again at every texture request.
+    if (m_image.isNull() && !m_decoded)
+        qCWarning(lcPelkanCoreLog) << "TransientImageProvider: cannot read" << m_path << ":" << reader.errorString();
+    m_decoded = true;
+}
+
+QSize TransientImageTextureFactory::textureSize() const
+{
+    if (!m_decoded)
+        decode();
+    return m_size;
+}
+
+QSGTexture *TransientImageTextureFactory::createTexture(QQuickWindow *window) const
+{
+    if (m_image.isNull())
+        decode();
+    if (m_size.isEmpty())
+        return nullptr;
+    QSGTexture *texture = window->createTextureFromImage(m_image, QQuickWindow::TextureCanUseAtlas);
+    if (dropsDecodedImages())
+        m_image = QImage();
+    return texture;
+}
