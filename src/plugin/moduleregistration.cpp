@@ -2,6 +2,7 @@
 
 #include "coreregistration.h"
 #include "autofill.h"
+#include "blureffect.h"
 #include "declarativebounceeffect.h"
 #include "declarativecover.h"
 #include "declarativecoveraction.h"
@@ -103,6 +104,7 @@ void registerPrivateModule(const char *uri)
     qmlRegisterType<DeclarativeCoverWindow>(uri, 1, 0, "CoverWindow");
     qmlRegisterType<DeclarativePreeditText>(uri, 1, 0, "PreeditText");
     qmlRegisterType<PulleyMenuLogic>(uri, 1, 0, "PulleyMenuLogic");
+    qmlRegisterType<BlurEffect>(uri, 1, 0, "BlurEffect");
     qmlRegisterType<AutoFill>(uri, 1, 0, "AutoFill");
     registerUncreatable<TimePickerMode>(uri, "TimePickerMode");
 }

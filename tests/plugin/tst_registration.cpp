@@ -159,6 +159,7 @@ void tst_Registration::creatableTypes_data()
     QTest::newRow("CoverActionList") << QByteArray("CoverActionList") << QByteArray("DeclarativeCoverActionList");
     QTest::newRow("BounceEffect") << QByteArray("BounceEffect") << QByteArray("DeclarativeBounceEffect");
     QTest::newRow("PulleyMenuLogic") << QByteArray("Private.PulleyMenuLogic") << QByteArray("PulleyMenuLogic");
+    QTest::newRow("BlurEffect") << QByteArray("Private.BlurEffect") << QByteArray("BlurEffect");
     QTest::newRow("FormattingProxyModel") << QByteArray("FormattingProxyModel") << QByteArray("FormattingProxyModel");
 }
 

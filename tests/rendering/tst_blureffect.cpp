@@ -1,0 +1,199 @@
+#include "blureffect.h"
+#include "blurkernel.h"
+
+#include <QQmlComponent>
+#include <QQmlEngine>
+#include <QQuickView>
+#include <QSignalSpy>
+#include <QtTest>
+
+// Colours on screen are compared with room for filtering and rounding.
+static bool near(QRgb pixel, int grey, int tolerance = 10)
+{
+    return qAbs(qRed(pixel) - grey) <= tolerance && qAbs(qGreen(pixel) - grey) <= tolerance
+            && qAbs(qBlue(pixel) - grey) <= tolerance;
+}
+
+class tst_BlurEffect : public QObject
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void weights_data();
+    void weights();
+    void levelSizes();
+    void properties();
+    void blurFollowsVisibilityUntilWritten();
+    void onScreen_data();
+    void onScreen();
+    void followsALiveSource();
+};
+
+void tst_BlurEffect::weights_data()
+{
+    QTest::addColumn<int>("kernel");
+    QTest::addColumn<float>("sigma");
+    QTest::newRow("5 taps") << 0 << 1.2f;
+    QTest::newRow("9 taps") << 1 << 1.8f;
+    QTest::newRow("33 taps, narrow") << 7 << 1.0f;
+    QTest::newRow("33 taps, wide") << 7 << 5.4f;
+}
+
+void tst_BlurEffect::weights()
+{
+    QFETCH(int, kernel);
+    QFETCH(float, sigma);
+    const QVector<float> w = BlurKernel::weights(sigma, kernel);
+    QCOMPARE(w.size(), 2 * (kernel + 1) + 1);
+    double sum = w[0];
+    for (int i = 1; i < w.size(); ++i) {
+        // Far taps of a narrow kernel may vanish, but never grow.
+        QVERIFY(w[i] <= w[i - 1]);
+        QVERIFY(w[i] >= 0);
+        sum += 2.0 * w[i];
+    }
+    QVERIFY(qAbs(sum - 1.0) < 1e-5);
+    // The ratio of neighbours is the Gaussian's, whatever the normalisation.
+    QVERIFY(qAbs(w[1] / w[0] - std::exp(-1.0 / (2.0 * sigma * sigma))) < 1e-5);
+}
+
+void tst_BlurEffect::levelSizes()
+{
+    QSize size(5, 8);
+    QList<QSize> sizes;
+    for (int i = 0; i < 4; ++i)
+        sizes << (size = BlurKernel::halved(size));
+    QCOMPARE(sizes, QList<QSize>({ QSize(3, 4), QSize(2, 2), QSize(1, 1), QSize(1, 1) }));
+}
+
+void tst_BlurEffect::properties()
+{
+    BlurEffect blur;
+    QCOMPARE(blur.kernel(), BlurEffect::Gaussian9);
+    QCOMPARE(blur.deviation(), 1.5f);
+    QCOMPARE(blur.levels(), 3);
+    QCOMPARE(blur.iterationBehavior(), BlurEffect::IterateLastLayer);
+    QSignalSpy deviation(&blur, &BlurEffect::deviationChanged);
+
+    // The kernel brings its own deviation, until one is written.
+    blur.setKernel(BlurEffect::Gaussian33);
+    QCOMPARE(blur.deviation(), 5.4f);
+    blur.setKernel(99);
+    QCOMPARE(blur.kernel(), BlurEffect::Gaussian33);
+    blur.setKernel(-3);
+    QCOMPARE(blur.kernel(), BlurEffect::Gaussian5);
+    QCOMPARE(blur.deviation(), 1.2f);
+    QCOMPARE(deviation.count(), 2);
+    blur.setDeviation(3.0f);
+    blur.setKernel(BlurEffect::Gaussian13);
+    QCOMPARE(blur.deviation(), 3.0f);
+    blur.resetDeviation();
+    QCOMPARE(blur.deviation(), 2.4f);
+
+    blur.setLevels(9);
+    QCOMPARE(blur.levels(), 5);
+    blur.setLevels(0);
+    QCOMPARE(blur.levels(), 1);
+    blur.setIterations(-2);
+    QCOMPARE(blur.iterations(), 1);
+    blur.setIntensity(2.5f);
+    QCOMPARE(blur.intensity(), 2.5f);
+}
+
+void tst_BlurEffect::blurFollowsVisibilityUntilWritten()
+{
+    BlurEffect blur;
+    QSignalSpy changed(&blur, &BlurEffect::blurChanged);
+    blur.setVisible(false);
+    QVERIFY(!blur.blur());
+    blur.setBlur(true);
+    blur.setVisible(true);
+    blur.setVisible(false);
+    QVERIFY(blur.blur());
+    blur.resetBlur();
+    QVERIFY(!blur.blur());
+    QCOMPARE(changed.count(), 3);
+}
+
+void tst_BlurEffect::onScreen_data()
+{
+    QTest::addColumn<QString>("settings");
+    QTest::addColumn<int>("inside");   // grey level well inside the white half
+    QTest::addColumn<int>("edge");     // grey level at the edge between the halves
+    QTest::addColumn<int>("far");      // grey level at the far edge of the black half
+    QTest::newRow("no blur") << "intensity: 0" << 255 << -1 << 0;
+    QTest::newRow("one level, one pass") << "levels: 1" << 255 << 128 << 0;
+    QTest::newRow("three levels, wide kernel") << "kernel: BlurEffect.Gaussian33" << 255 << 128 << 0;
+    QTest::newRow("iterated on every level") << "iterations: 3; iterationBehavior: BlurEffect.IterateAllLayers"
+                                             << 255 << 128 << 0;
+    QTest::newRow("half red overlay") << "overlayColor: '#80ff0000'; intensity: 0" << -1 << -1 << -1;
+}
+
+void tst_BlurEffect::onScreen()
+{
+    QFETCH(QString, settings);
+    QFETCH(int, inside);
+    QFETCH(int, edge);
+    QFETCH(int, far);
+
+    // The source: white on the left, black on the right; the blur beside it.
+    QQuickView view;
+    QQmlComponent component(view.engine());
+    component.setData("import QtQuick 2.6\n"
+                      "import Quorvane.Pelkan.private 1.0\n"
+                      "Rectangle { width: 200; height: 100; color: 'blue'\n"
+                      "  Rectangle { id: source; width: 100; height: 100; color: 'black'\n"
+                      "    Rectangle { width: 50; height: 100; color: 'white' } }\n"
+                      "  BlurEffect { x: 100; width: 100; height: 100; sourceItem: source; "
+                              + settings.toUtf8() + " }\n"
+                      "}\n", QUrl());
+    auto root = qobject_cast<QQuickItem *>(component.create());
+    QVERIFY2(root, qPrintable(component.errorString()));
+    view.setContent(QUrl(), nullptr, root);
+    view.show();
+    QVERIFY(QTest::qWaitForWindowExposed(&view));
+    QImage grab;
+    // Wait until the effect draws at all (the background is blue).
+    QTRY_VERIFY((grab = view.grabWindow(), qBlue(grab.pixel(195, 50)) < 200 || qRed(grab.pixel(195, 50)) > 100));
+
+    if (settings.contains(QLatin1String("overlay"))) {
+        QCOMPARE(qRed(grab.pixel(110, 50)), 255);
+        QVERIFY(qAbs(qGreen(grab.pixel(110, 50)) - 127) < 4);
+        QVERIFY(qAbs(qRed(grab.pixel(190, 50)) - 128) < 4 && qGreen(grab.pixel(190, 50)) == 0);
+        return;
+    }
+    QVERIFY2(near(grab.pixel(105, 50), inside), qPrintable(QColor(grab.pixel(105, 50)).name()));
+    // Nothing is read beyond the source: its far edge stays black.
+    QVERIFY2(near(grab.pixel(199, 50), far), qPrintable(QColor(grab.pixel(199, 50)).name()));
+    if (edge < 0) {
+        QVERIFY(near(grab.pixel(149, 50), 255) && near(grab.pixel(150, 50), 0));
+    } else {
+        QVERIFY2(near(grab.pixel(150, 50), edge, 40), qPrintable(QColor(grab.pixel(150, 50)).name()));
+        // A soft edge: greys on both sides of it.
+        QVERIFY(qRed(grab.pixel(148, 50)) < 250 && qRed(grab.pixel(151, 50)) > 5);
+    }
+}
+
+void tst_BlurEffect::followsALiveSource()
+{
+    QQuickView view;
+    QQmlComponent component(view.engine());
+    component.setData("import QtQuick 2.6\n"
+                      "import Quorvane.Pelkan.private 1.0\n"
+                      "Item { width: 200; height: 100\n"
+                      "  Rectangle { id: source; objectName: 'source'; width: 100; height: 100; color: 'black' }\n"
+                      "  BlurEffect { x: 100; width: 100; height: 100; sourceItem: source }\n"
+                      "}\n", QUrl());
+    auto root = qobject_cast<QQuickItem *>(component.create());
+    QVERIFY2(root, qPrintable(component.errorString()));
+    view.setContent(QUrl(), nullptr, root);
+    view.show();
+    QVERIFY(QTest::qWaitForWindowExposed(&view));
+    QTRY_VERIFY(near(view.grabWindow().pixel(150, 50), 0));
+
+    root->findChild<QQuickItem *>(QStringLiteral("source"))->setProperty("color", QColor(Qt::white));
+    QTRY_VERIFY(near(view.grabWindow().pixel(150, 50), 255));
+}
+
+QTEST_MAIN(tst_BlurEffect)
+#include "tst_blureffect.moc"
