@@ -90,8 +90,8 @@ bool BlurEffectTexture::ensureTargets(const QSize &size)
     return true;
 }
 
-void BlurEffectTexture::drawPass(BlurEffectShaderProgram *program, const QRectF &input, const QSize &inputTextureSize,
-                                 QOpenGLFramebufferObject *target, const QSize &output)
+void BlurEffectTexture::drawPass(BlurEffectShaderProgram *program, const QRectF &input, QOpenGLFramebufferObject *target,
+                                 const QSize &output)
 {
     QOpenGLFunctions *f = QOpenGLContext::currentContext()->functions();
     target->bind();
@@ -102,7 +102,9 @@ void BlurEffectTexture::drawPass(BlurEffectShaderProgram *program, const QRectF 
                                0, 0, 0, 1);
     QOpenGLShaderProgram &p = program->program();
     p.setUniformValue(program->sourceTransform, transform);
-    p.setUniformValue(program->deltas, QVector3D(1.0f / inputTextureSize.width(), 1.0f / inputTextureSize.height(), 0));
+    // Taps are spaced by the output's pixels (the input's x runs along the output's y), so
+    // a pass that also halves the size blurs as far as the passes after it.
+    p.setUniformValue(program->deltas, QVector3D(float(input.width() / output.height()), float(input.height() / output.width()), 0));
     f->glDrawArrays(GL_TRIANGLE_STRIP, 0, 4);
     drainErrors(f, "Blur shader setup error:");
 }
@@ -147,11 +149,9 @@ bool BlurEffectTexture::render(QSGTexture *source, BlurEffectShaderProgram *prog
     f->glDisable(GL_STENCIL_TEST);
     f->glColorMask(GL_TRUE, GL_TRUE, GL_TRUE, GL_TRUE);
 
-    // The source may sit in an atlas: read only its rectangle, with texel steps of the
-    // whole texture.
+    // The source may sit in an atlas: read only its rectangle.
     source->setFiltering(QSGTexture::Linear);
     const QRectF sourceRect = source->normalizedTextureSubRect();
-    const QSize sourceTexture(qRound(base.width() / sourceRect.width()), qRound(base.height() / sourceRect.height()));
     const QSize full = m_normal->size();
     const QSize fullTransposed = m_transposed->size();
 
@@ -164,15 +164,15 @@ bool BlurEffectTexture::render(QSGTexture *source, BlurEffectShaderProgram *prog
         for (int i = 0; i < iterations; ++i) {
             if (fromSource) {
                 source->bind();
-                drawPass(program, sourceRect, sourceTexture, m_transposed.get(), size.transposed());
+                drawPass(program, sourceRect, m_transposed.get(), size.transposed());
             } else {
                 f->glBindTexture(GL_TEXTURE_2D, m_normal->texture());
                 const QRectF input(0, 0, qreal(previousLevel.width()) / full.width(), qreal(previousLevel.height()) / full.height());
-                drawPass(program, input, full, m_transposed.get(), size.transposed());
+                drawPass(program, input, m_transposed.get(), size.transposed());
             }
             f->glBindTexture(GL_TEXTURE_2D, m_transposed->texture());
             const QRectF input(0, 0, qreal(size.height()) / fullTransposed.width(), qreal(size.width()) / fullTransposed.height());
-            drawPass(program, input, fullTransposed, m_normal.get(), size);
+            drawPass(program, input, m_normal.get(), size);
             fromSource = false;
             previousLevel = size;
         }

@@ -36,8 +36,8 @@ public:
 
 private:
     bool ensureTargets(const QSize &size);
-    void drawPass(BlurEffectShaderProgram *program, const QRectF &input, const QSize &inputTextureSize,
-                  QOpenGLFramebufferObject *target, const QSize &output);
+    void drawPass(BlurEffectShaderProgram *program, const QRectF &input, QOpenGLFramebufferObject *target,
+                  const QSize &output);
 
     std::unique_ptr<QOpenGLFramebufferObject> m_normal;     // the source's orientation
     std::unique_ptr<QOpenGLFramebufferObject> m_transposed; // width and height swapped

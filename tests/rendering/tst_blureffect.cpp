@@ -27,6 +27,7 @@ private Q_SLOTS:
     void onScreen_data();
     void onScreen();
     void followsALiveSource();
+    void sameBothWays();
 };
 
 void tst_BlurEffect::weights_data()
@@ -193,6 +194,35 @@ void tst_BlurEffect::followsALiveSource()
 
     root->findChild<QQuickItem *>(QStringLiteral("source"))->setProperty("color", QColor(Qt::white));
     QTRY_VERIFY(near(view.grabWindow().pixel(150, 50), 255));
+}
+
+void tst_BlurEffect::sameBothWays()
+{
+    // A white square in the middle of black spreads alike across and down, on every level.
+    QQuickView view;
+    QQmlComponent component(view.engine());
+    component.setData("import QtQuick 2.6\n"
+                      "import Quorvane.Pelkan.private 1.0\n"
+                      "Item { width: 240; height: 120\n"
+                      "  Rectangle { id: source; width: 120; height: 120; color: 'black'\n"
+                      "    Rectangle { x: 50; y: 50; width: 20; height: 20; color: 'white' } }\n"
+                      "  BlurEffect { x: 120; width: 120; height: 120; sourceItem: source; kernel: BlurEffect.Gaussian17 }\n"
+                      "}\n", QUrl());
+    auto root = qobject_cast<QQuickItem *>(component.create());
+    QVERIFY2(root, qPrintable(component.errorString()));
+    view.setContent(QUrl(), nullptr, root);
+    view.show();
+    QVERIFY(QTest::qWaitForWindowExposed(&view));
+    QImage grab;
+    QTRY_VERIFY((grab = view.grabWindow(), qRed(grab.pixel(180, 60)) > 20));
+    for (int distance : { 0, 8, 16, 24 }) {
+        const int across = qRed(grab.pixel(180 + distance, 60));
+        const int down = qRed(grab.pixel(180, 60 + distance));
+        QVERIFY2(qAbs(across - down) <= 8, qPrintable(QStringLiteral("%1: %2 across, %3 down").arg(distance).arg(across).arg(down)));
+    }
+    // And it does spread: the middle is no longer white, the corners of the square are lit.
+    QVERIFY(qRed(grab.pixel(180, 60)) < 200);
+    QVERIFY(qRed(grab.pixel(180 + 16, 60)) > 10);
 }
 
 QTEST_MAIN(tst_BlurEffect)
