@@ -21,9 +21,10 @@ namespace {
 QByteArray effect(const QString &kind)
 {
     if (kind == QLatin1String("pelkan"))
-        // Three levels of a 17-tap kernel: 3.6 * sqrt(1 + 4 + 16), about 16 pixels.
+        // Three levels of the 9-tap kernel from half size on: 1.8 * 2 * sqrt(1 + 4 + 16),
+        // about 16 pixels.
         return "import Quorvane.Pelkan.private 1.0\n"
-               "BlurEffect { anchors.fill: parent; sourceItem: content; kernel: BlurEffect.Gaussian17; levels: 3 }\n";
+               "BlurEffect { anchors.fill: parent; sourceItem: content; kernel: BlurEffect.Gaussian9; levels: 3 }\n";
     if (kind == QLatin1String("gaussian"))
         return "import QtGraphicalEffects 1.0\n"
                "GaussianBlur { anchors.fill: parent; source: content; radius: 32; samples: 65; deviation: 16 }\n";

@@ -120,7 +120,10 @@ bool BlurEffectTexture::render(QSGTexture *source, BlurEffectShaderProgram *prog
     f->glGetIntegerv(GL_FRAMEBUFFER_BINDING, &previous);
 
     const QSize base = source->textureSize();
-    if (base.isEmpty() || !ensureTargets(base))
+    // The first level is already half the source's size: its first pass reads the source
+    // at full detail and downsamples as it blurs. A blur needs no more.
+    const QSize first = BlurKernel::halved(base);
+    if (base.isEmpty() || !ensureTargets(first))
         return false;
 
     QVector<float> weights = BlurKernel::weights(parameters.deviation, parameters.kernel);
@@ -155,8 +158,8 @@ bool BlurEffectTexture::render(QSGTexture *source, BlurEffectShaderProgram *prog
     const QSize full = m_normal->size();
     const QSize fullTransposed = m_transposed->size();
 
-    QSize size = base;
-    QSize previousLevel = base;
+    QSize size = first;
+    QSize previousLevel = first;
     bool fromSource = true;
     for (int level = 0; level < parameters.levels; ++level) {
         const bool last = level == parameters.levels - 1;

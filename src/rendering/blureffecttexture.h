@@ -13,8 +13,9 @@ class QOpenGLFramebufferObject;
 
 // The blurred copy of a source texture, rendered on the render thread into a pair of
 // offscreen textures. Each pass blurs along its input's x axis and writes its result
-// transposed, so a pair of passes blurs both ways and ends the right way round. Levels
-// shrink by half each, reusing the corner of the same textures.
+// transposed, so a pair of passes blurs both ways and ends the right way round. The
+// first level is half the source's size and each further level half the one before,
+// reusing the corner of the same textures.
 class BlurEffectTexture : public QSGTexture
 {
     Q_OBJECT
