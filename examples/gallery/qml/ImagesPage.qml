@@ -1,5 +1,6 @@
 import QtQuick 2.6
 import Quorvane.Pelkan 1.0
+import Quorvane.Pelkan.private 1.0 as Private
 
 // Theme images through the "theme" image provider, tinted by the colour in their name.
 // The pattern tile is marked Grayscale: it follows the theme's primary colour on the GPU
@@ -63,6 +64,39 @@ Flickable {
             color: Theme.highlightColor
             ratio: 0
             dashed: true
+        }
+
+        SectionHeader { text: "Blur, plain and tinted" }
+
+        Flow {
+            width: column.width
+            spacing: Theme.paddingLarge
+            Grid {
+                id: blurSource
+                columns: 4
+                Repeater {
+                    model: page.icons
+                    Image {
+                        width: Theme.iconSizeMedium
+                        height: width
+                        source: "image://theme/" + modelData + "?#ff6f61"
+                    }
+                }
+            }
+            Private.BlurEffect {
+                width: blurSource.width
+                height: blurSource.height
+                sourceItem: blurSource
+                kernel: Private.BlurEffect.Gaussian13
+                levels: 2
+            }
+            Private.BlurEffect {
+                width: blurSource.width
+                height: blurSource.height
+                sourceItem: blurSource
+                levels: 2
+                overlayColor: Theme.rgba(Theme.highlightBackgroundColor, 0.3)
+            }
         }
 
         SectionHeader { text: "Follows the primary colour" }
