@@ -1,7 +1,7 @@
+#include "../common/sceneview.h"
 #include "blureffect.h"
 #include "blurkernel.h"
 
-#include <QQmlComponent>
 #include <QQmlEngine>
 #include <QQuickView>
 #include <QSignalSpy>
@@ -139,20 +139,15 @@ void tst_BlurEffect::onScreen()
 
     // The source: white on the left, black on the right; the blur beside it.
     QQuickView view;
-    QQmlComponent component(view.engine());
-    component.setData("import QtQuick 2.6\n"
-                      "import Quorvane.Pelkan.private 1.0\n"
-                      "Rectangle { width: 200; height: 100; color: 'blue'\n"
-                      "  Rectangle { id: source; width: 100; height: 100; color: 'black'\n"
-                      "    Rectangle { width: 50; height: 100; color: 'white' } }\n"
-                      "  BlurEffect { x: 100; width: 100; height: 100; sourceItem: source; "
-                              + settings.toUtf8() + " }\n"
-                      "}\n", QUrl());
-    auto root = qobject_cast<QQuickItem *>(component.create());
-    QVERIFY2(root, qPrintable(component.errorString()));
-    view.setContent(QUrl(), nullptr, root);
-    view.show();
-    QVERIFY(QTest::qWaitForWindowExposed(&view));
+    QQuickItem *root = showScene(view, "import QtQuick 2.6\n"
+                                   "import Quorvane.Pelkan.private 1.0\n"
+                                   "Rectangle { width: 200; height: 100; color: 'blue'\n"
+                                   "  Rectangle { id: source; width: 100; height: 100; color: 'black'\n"
+                                   "    Rectangle { width: 50; height: 100; color: 'white' } }\n"
+                                   "  BlurEffect { x: 100; width: 100; height: 100; sourceItem: source; "
+                                           + settings.toUtf8() + " }\n"
+                                   "}\n");
+    QVERIFY(root);
     QImage grab;
     // Wait until the effect draws at all (the background is blue).
     QTRY_VERIFY((grab = view.grabWindow(), qBlue(grab.pixel(195, 50)) < 200 || qRed(grab.pixel(195, 50)) > 100));
@@ -178,18 +173,13 @@ void tst_BlurEffect::onScreen()
 void tst_BlurEffect::followsALiveSource()
 {
     QQuickView view;
-    QQmlComponent component(view.engine());
-    component.setData("import QtQuick 2.6\n"
-                      "import Quorvane.Pelkan.private 1.0\n"
-                      "Item { width: 200; height: 100\n"
-                      "  Rectangle { id: source; objectName: 'source'; width: 100; height: 100; color: 'black' }\n"
-                      "  BlurEffect { x: 100; width: 100; height: 100; sourceItem: source }\n"
-                      "}\n", QUrl());
-    auto root = qobject_cast<QQuickItem *>(component.create());
-    QVERIFY2(root, qPrintable(component.errorString()));
-    view.setContent(QUrl(), nullptr, root);
-    view.show();
-    QVERIFY(QTest::qWaitForWindowExposed(&view));
+    QQuickItem *root = showScene(view, "import QtQuick 2.6\n"
+                                   "import Quorvane.Pelkan.private 1.0\n"
+                                   "Item { width: 200; height: 100\n"
+                                   "  Rectangle { id: source; objectName: 'source'; width: 100; height: 100; color: 'black' }\n"
+                                   "  BlurEffect { x: 100; width: 100; height: 100; sourceItem: source }\n"
+                                   "}\n");
+    QVERIFY(root);
     QTRY_VERIFY(near(view.grabWindow().pixel(150, 50), 0));
 
     root->findChild<QQuickItem *>(QStringLiteral("source"))->setProperty("color", QColor(Qt::white));
@@ -200,19 +190,14 @@ void tst_BlurEffect::sameBothWays()
 {
     // A white square in the middle of black spreads alike across and down, on every level.
     QQuickView view;
-    QQmlComponent component(view.engine());
-    component.setData("import QtQuick 2.6\n"
-                      "import Quorvane.Pelkan.private 1.0\n"
-                      "Item { width: 240; height: 120\n"
-                      "  Rectangle { id: source; width: 120; height: 120; color: 'black'\n"
-                      "    Rectangle { x: 50; y: 50; width: 20; height: 20; color: 'white' } }\n"
-                      "  BlurEffect { x: 120; width: 120; height: 120; sourceItem: source; kernel: BlurEffect.Gaussian17 }\n"
-                      "}\n", QUrl());
-    auto root = qobject_cast<QQuickItem *>(component.create());
-    QVERIFY2(root, qPrintable(component.errorString()));
-    view.setContent(QUrl(), nullptr, root);
-    view.show();
-    QVERIFY(QTest::qWaitForWindowExposed(&view));
+    QQuickItem *root = showScene(view, "import QtQuick 2.6\n"
+                                   "import Quorvane.Pelkan.private 1.0\n"
+                                   "Item { width: 240; height: 120\n"
+                                   "  Rectangle { id: source; width: 120; height: 120; color: 'black'\n"
+                                   "    Rectangle { x: 50; y: 50; width: 20; height: 20; color: 'white' } }\n"
+                                   "  BlurEffect { x: 120; width: 120; height: 120; sourceItem: source; kernel: BlurEffect.Gaussian17 }\n"
+                                   "}\n");
+    QVERIFY(root);
     QImage grab;
     QTRY_VERIFY((grab = view.grabWindow(), qRed(grab.pixel(180, 60)) > 20));
     for (int distance : { 0, 8, 16, 24 }) {

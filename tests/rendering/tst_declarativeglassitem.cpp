@@ -1,8 +1,8 @@
+#include "../common/sceneview.h"
 #include "declarativeglassitem.h"
 #include "glassitemnode.h"
 #include "glassmaterial.h"
 
-#include <QQmlComponent>
 #include <QQmlEngine>
 #include <QQuickItem>
 #include <QQuickView>
@@ -89,19 +89,9 @@ QImage tst_DeclarativeGlassItem::render(const QByteArray &glass, const QSize &si
 {
     QQuickView view;
     view.setColor(Qt::black);
-    QQmlComponent component(view.engine());
-    component.setData("import QtQuick 2.6\nimport Quorvane.Pelkan 1.0\n"
-                      "Item { width: " + QByteArray::number(size.width()) + "; height: " + QByteArray::number(size.height())
-                      + "\n  GlassItem { anchors.fill: parent; " + glass + " } }\n", QUrl());
-    auto root = qobject_cast<QQuickItem *>(component.create());
-    if (!root) {
-        qWarning() << component.errorString();
-        return QImage();
-    }
-    view.setContent(QUrl(), nullptr, root);
-    view.resize(size);
-    view.show();
-    if (!QTest::qWaitForWindowExposed(&view))
+    if (!showScene(view, "import QtQuick 2.6\nimport Quorvane.Pelkan 1.0\n"
+                         "Item { width: " + QByteArray::number(size.width()) + "; height: " + QByteArray::number(size.height())
+                         + "\n  GlassItem { anchors.fill: parent; " + glass + " } }\n"))
         return QImage();
     QTest::qWait(100); // the pattern arrives from the image provider
     return view.grabWindow();

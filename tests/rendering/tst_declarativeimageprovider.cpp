@@ -1,11 +1,11 @@
 #include "../common/configfixture.h"
+#include "../common/sceneview.h"
 #include "declarativeimageprovider.h"
 #include "theme.h"
 #include "themeiconresolver.h"
 
 #include <QPainter>
 #include <QQuickItem>
-#include <QQmlComponent>
 #include <QQmlContext>
 #include <QQmlEngine>
 #include <QQuickView>
@@ -144,20 +144,14 @@ void tst_DeclarativeImageProvider::tintedIconsOnScreen()
     QQuickView view;
     view.engine()->addImageProvider(QStringLiteral("theme"), new DeclarativeImageProvider);
     view.setColor(Qt::black);
-    QQmlComponent component(view.engine());
-    component.setData("import QtQuick 2.6\n"
-                      "Item { width: 300; height: 100\n"
-                      "  Image { x: 10; y: 10; width: 32; height: 32; source: 'image://theme/icon-square?#ff0000' }\n"
-                      "  Image { x: 60; y: 10; width: 32; height: 32; source: 'image://theme/icon-square?#3050ff' }\n"
-                      "  Image { x: 110; y: 10; width: 32; height: 32; source: 'image://theme/icon-square' }\n"
-                      "  Image { x: 10; y: 50; width: 600; height: 40; source: 'image://theme/icon-large?#00ff00' }\n"
-                      "}\n", QUrl());
-    auto root = qobject_cast<QQuickItem *>(component.create());
-    QVERIFY2(root, qPrintable(component.errorString()));
-    view.setContent(QUrl(), nullptr, root);
-    view.resize(300, 100);
-    view.show();
-    QVERIFY(QTest::qWaitForWindowExposed(&view));
+    QQuickItem *root = showScene(view, "import QtQuick 2.6\n"
+                                   "Item { width: 300; height: 100\n"
+                                   "  Image { x: 10; y: 10; width: 32; height: 32; source: 'image://theme/icon-square?#ff0000' }\n"
+                                   "  Image { x: 60; y: 10; width: 32; height: 32; source: 'image://theme/icon-square?#3050ff' }\n"
+                                   "  Image { x: 110; y: 10; width: 32; height: 32; source: 'image://theme/icon-square' }\n"
+                                   "  Image { x: 10; y: 50; width: 600; height: 40; source: 'image://theme/icon-large?#00ff00' }\n"
+                                   "}\n");
+    QVERIFY(root);
     QImage grab;
     QTRY_VERIFY((grab = view.grabWindow(), near(grab.pixel(26, 26), Qt::red)));
     QVERIFY2(near(grab.pixel(76, 26), QColor(0x30, 0x50, 0xff)), qPrintable(QColor(grab.pixel(76, 26)).name()));
@@ -175,16 +169,10 @@ void tst_DeclarativeImageProvider::themeColourChangeRetints()
     QQuickView view;
     view.engine()->addImageProvider(QStringLiteral("theme"), new DeclarativeImageProvider);
     view.setColor(Qt::black);
-    QQmlComponent component(view.engine());
-    component.setData("import QtQuick 2.6\n"
-                      "Item { width: 100; height: 100\n"
-                      "  Image { x: 10; y: 10; width: 32; height: 32; source: 'image://theme/icon-themed' } }\n", QUrl());
-    auto root = qobject_cast<QQuickItem *>(component.create());
-    QVERIFY2(root, qPrintable(component.errorString()));
-    view.setContent(QUrl(), nullptr, root);
-    view.resize(100, 100);
-    view.show();
-    QVERIFY(QTest::qWaitForWindowExposed(&view));
+    QQuickItem *root = showScene(view, "import QtQuick 2.6\n"
+                                   "Item { width: 100; height: 100\n"
+                                   "  Image { x: 10; y: 10; width: 32; height: 32; source: 'image://theme/icon-themed' } }\n");
+    QVERIFY(root);
     QImage grab;
     QTRY_VERIFY((grab = view.grabWindow(), near(grab.pixel(26, 26), Qt::white)));
 

@@ -1,7 +1,7 @@
+#include "../common/sceneview.h"
 #include "transientimageprovider.h"
 #include "transientimagetexturefactory.h"
 
-#include <QQmlComponent>
 #include <QQmlEngine>
 #include <QQuickItem>
 #include <QQuickView>
@@ -83,18 +83,12 @@ void tst_TransientImageProvider::drawnOnScreen()
     QQuickView view;
     view.engine()->addImageProvider(QStringLiteral("transientimage"), new TransientImageProvider);
     view.setColor(Qt::black);
-    QQmlComponent component(view.engine());
-    component.setData("import QtQuick 2.6\n"
-                      "Item { width: 100; height: 100\n"
-                      "  Image { x: 10; y: 10; width: 64; height: 32; source: 'image://transientimage/"
-                              + QUrl::fromLocalFile(m_image).toEncoded() + "' }\n"
-                      "}\n", QUrl());
-    auto root = qobject_cast<QQuickItem *>(component.create());
-    QVERIFY2(root, qPrintable(component.errorString()));
-    view.setContent(QUrl(), nullptr, root);
-    view.resize(100, 100);
-    view.show();
-    QVERIFY(QTest::qWaitForWindowExposed(&view));
+    QQuickItem *root = showScene(view, "import QtQuick 2.6\n"
+                                   "Item { width: 100; height: 100\n"
+                                   "  Image { x: 10; y: 10; width: 64; height: 32; source: 'image://transientimage/"
+                                           + QUrl::fromLocalFile(m_image).toEncoded() + "' }\n"
+                                   "}\n");
+    QVERIFY(root);
     QImage grab;
     QTRY_VERIFY((grab = view.grabWindow(), qRed(grab.pixel(40, 25)) > 240 && qGreen(grab.pixel(40, 25)) < 16));
     QCOMPARE(grab.pixel(90, 90), qRgb(0, 0, 0));
