@@ -4,6 +4,7 @@
 #include "autofill.h"
 #include "blureffect.h"
 #include "declarativebounceeffect.h"
+#include "declarativeclipboard.h"
 #include "declarativecover.h"
 #include "declarativecoveraction.h"
 #include "declarativecoveractionlist.h"
@@ -13,6 +14,7 @@
 #include "declarativeglassitem.h"
 #include "declarativepreedittext.h"
 #include "declarativepagestackbase.h"
+#include "declarativestandardpaths.h"
 #include "declarativewindow.h"
 #include "formattingproxymodel.h"
 #include "pulleymenulogic.h"
@@ -68,6 +70,8 @@ void registerPublicModule(const char *uri)
     registerSingleton<Pelkan::Theme>(uri, "Theme");
     registerSingleton<DeclarativeFormatter>(uri, "Format");
     registerSingleton<Pelkan::Screen>(uri, "Screen");
+    registerSingleton<DeclarativeStandardPaths>(uri, "StandardPaths");
+    registerSingleton<DeclarativeClipboard>(uri, "Clipboard");
     registerUncreatable<DeclarativePageStatus>(uri, "PageStatus");
     registerUncreatable<DeclarativePageNavigation>(uri, "PageNavigation");
     registerUncreatable<DeclarativeDialogStatus>(uri, "DialogStatus");
