@@ -64,6 +64,8 @@ void BlurEffectNode::releaseTargets()
 
 void BlurEffectNode::preprocess()
 {
+    QSGTexture *const previousSource = m_material.source;
+    QSGTexture *const previousBlur = m_material.blur;
     QSGTexture *source = m_source ? m_source->texture() : nullptr;
     // A live source (a layer) renders on demand: make sure it is current before use.
     if (auto dynamic = qobject_cast<QSGDynamicTexture *>(source)) {
@@ -87,5 +89,7 @@ void BlurEffectNode::preprocess()
         if (m_provider)
             m_provider->setTexture(m_material.blur);
     }
-    markDirty(DirtyMaterial);
+    // New pixels in the same textures need nothing: the shader binds them every frame.
+    if (m_material.source != previousSource || m_material.blur != previousBlur)
+        markDirty(DirtyMaterial);
 }
