@@ -21,7 +21,6 @@ class tst_BlurEffect : public QObject
 private Q_SLOTS:
     void weights_data();
     void weights();
-    void levelSizes();
     void properties();
     void blurFollowsVisibilityUntilWritten();
     void onScreen_data();
@@ -56,15 +55,6 @@ void tst_BlurEffect::weights()
     QVERIFY(qAbs(sum - 1.0) < 1e-5);
     // The ratio of neighbours is the Gaussian's, whatever the normalisation.
     QVERIFY(qAbs(w[1] / w[0] - std::exp(-1.0 / (2.0 * sigma * sigma))) < 1e-5);
-}
-
-void tst_BlurEffect::levelSizes()
-{
-    QSize size(5, 8);
-    QList<QSize> sizes;
-    for (int i = 0; i < 4; ++i)
-        sizes << (size = BlurKernel::halved(size));
-    QCOMPARE(sizes, QList<QSize>({ QSize(3, 4), QSize(2, 2), QSize(1, 1), QSize(1, 1) }));
 }
 
 void tst_BlurEffect::properties()

@@ -1,28 +1,24 @@
 #include <QClipboard>
-#include <QDir>
 #include <QGuiApplication>
 #include <QQmlComponent>
 #include <QQmlEngine>
 #include <QSignalSpy>
 #include <QtTest>
 
-// The platform singletons as QML sees them, through the installed module.
-class tst_PlatformSingletons : public QObject
+// The clipboard singleton as QML sees it, through the installed module.
+class tst_Clipboard : public QObject
 {
     Q_OBJECT
 
 private Q_SLOTS:
-    void standardPaths_data();
-    void standardPaths();
     void clipboard();
 
 private:
     QObject *singleton(const char *name);
     QQmlEngine m_engine;
-    QObjectList m_roots;
 };
 
-QObject *tst_PlatformSingletons::singleton(const char *name)
+QObject *tst_Clipboard::singleton(const char *name)
 {
     QQmlComponent component(&m_engine);
     component.setData(QByteArray("import QtQml 2.2\nimport Quorvane.Pelkan 1.0\nQtObject { property QtObject it: ") + name
@@ -32,34 +28,11 @@ QObject *tst_PlatformSingletons::singleton(const char *name)
         qWarning() << component.errorString();
         return nullptr;
     }
-    m_roots << root;
+    root->setParent(&m_engine);
     return root->property("it").value<QObject *>();
 }
 
-void tst_PlatformSingletons::standardPaths_data()
-{
-    QTest::addColumn<QString>("property");
-    QTest::addColumn<QString>("expected");
-    QTest::newRow("home") << "home" << QDir::homePath();
-    // The test run's own data and cache folders (scripts/run-tests sets them), with this
-    // application's name.
-    if (qEnvironmentVariableIsSet("XDG_DATA_HOME") && qEnvironmentVariableIsSet("XDG_CACHE_HOME")) {
-        QTest::newRow("data") << "data" << qEnvironmentVariable("XDG_DATA_HOME") + QLatin1String("/tst_platformsingletons");
-        QTest::newRow("cache") << "cache" << qEnvironmentVariable("XDG_CACHE_HOME") + QLatin1String("/tst_platformsingletons");
-    }
-    QTest::newRow("temporary") << "temporary" << QDir::tempPath();
-}
-
-void tst_PlatformSingletons::standardPaths()
-{
-    QFETCH(QString, property);
-    QFETCH(QString, expected);
-    QObject *paths = singleton("StandardPaths");
-    QVERIFY(paths);
-    QCOMPARE(paths->property(property.toLatin1()).toString(), expected);
-}
-
-void tst_PlatformSingletons::clipboard()
+void tst_Clipboard::clipboard()
 {
     QGuiApplication::clipboard()->clear();
     QObject *clipboard = singleton("Clipboard");
@@ -86,5 +59,5 @@ void tst_PlatformSingletons::clipboard()
     QCOMPARE(hasText.count(), 2);
 }
 
-QTEST_MAIN(tst_PlatformSingletons)
-#include "tst_platformsingletons.moc"
+QTEST_MAIN(tst_Clipboard)
+#include "tst_clipboard.moc"
