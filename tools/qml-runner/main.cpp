@@ -1,4 +1,5 @@
-// Runs one QML file as an application would: pelkan-qml-runner FILE [name=value ...].
+// Runs one QML file as an application would: pelkan-qml-runner FILE [name=value ...],
+// with the modules of the build tree it was built in.
 // Each name=value sets a property of the root object before it completes ("true" and
 // "false" are booleans, whole numbers are integers, anything else is text).
 
@@ -36,6 +37,7 @@ int main(int argc, char *argv[])
     }
 
     QQmlApplicationEngine engine;
+    engine.addImportPath(QStringLiteral(PELKAN_QML_DIR));
     engine.setInitialProperties(properties);
     engine.load(QUrl::fromLocalFile(arguments.at(1)));
     if (engine.rootObjects().isEmpty())
