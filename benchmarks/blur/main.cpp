@@ -4,7 +4,6 @@
 // process of its own, in the basic render loop, for 200 frames after 30 to settle.
 
 #include <QCoreApplication>
-#include <QElapsedTimer>
 #include <QGuiApplication>
 #include <QProcess>
 #include <QQmlComponent>
@@ -13,23 +12,25 @@
 #include <QRegularExpression>
 #include <QTextStream>
 
+#include "../common/frametiming.h"
+
 #include <algorithm>
 #include <vector>
 
 namespace {
 
-QByteArray effect(const QString &kind)
+// The effect's import line and its element.
+QPair<QByteArray, QByteArray> effect(const QString &kind)
 {
     if (kind == QLatin1String("pelkan"))
         // Three levels of the 9-tap kernel from half size on: 1.8 * 2 * sqrt(1 + 4 + 16),
         // about 16 pixels.
-        return "import Quorvane.Pelkan.private 1.0\n"
-               "BlurEffect { anchors.fill: parent; sourceItem: content; kernel: BlurEffect.Gaussian9; levels: 3 }\n";
+        return { "import Quorvane.Pelkan.private 1.0\n",
+                 "BlurEffect { anchors.fill: parent; sourceItem: content; kernel: BlurEffect.Gaussian9; levels: 3 }\n" };
     if (kind == QLatin1String("gaussian"))
-        return "import QtGraphicalEffects 1.0\n"
-               "GaussianBlur { anchors.fill: parent; source: content; radius: 32; samples: 65; deviation: 16 }\n";
-    return "import QtGraphicalEffects 1.0\n"
-           "FastBlur { anchors.fill: parent; source: content; radius: 64 }\n";
+        return { "import QtGraphicalEffects 1.0\n",
+                 "GaussianBlur { anchors.fill: parent; source: content; radius: 32; samples: 65; deviation: 16 }\n" };
+    return { "import QtGraphicalEffects 1.0\n", "FastBlur { anchors.fill: parent; source: content; radius: 64 }\n" };
 }
 
 int runVariant(const QString &kind)
@@ -37,47 +38,29 @@ int runVariant(const QString &kind)
     qputenv("QSG_RENDER_LOOP", "basic");
     QQuickView view;
     view.engine()->addImportPath(QStringLiteral(PELKAN_QML_DIR));
+    const QPair<QByteArray, QByteArray> blur = effect(kind);
     const QByteArray document =
-            "import QtQuick 2.6\n"
+            blur.first + "import QtQuick 2.6\n"
             "Item { width: 540; height: 960\n"
             "  Item { id: content; anchors.fill: parent; visible: false\n"
             "    Grid { columns: 9; Repeater { model: 144; Rectangle { width: 60; height: 60\n"
             "      color: Qt.hsla((index % 12) / 12, 0.7, 0.5, 1) } } }\n"
             "    Rectangle { id: bar; width: 540; height: 40; color: 'white'\n"
             "      NumberAnimation on y { from: 0; to: 920; duration: 1000; loops: Animation.Infinite } } }\n"
-            "  Loader { anchors.fill: parent; sourceComponent: Component {\n" + effect(kind) + "  } }\n"
-            "}\n";
-    // Each variant imports only its own module; imports come first in a document.
-    QByteArray full = document;
+            "  " + blur.second + "}\n";
     QQmlComponent component(view.engine());
-    const QByteArray effectText = effect(kind);
-    const QByteArray importLine = effectText.left(effectText.indexOf('\n') + 1);
-    full.replace(importLine, "");
-    component.setData(importLine + full, QUrl());
+    component.setData(document, QUrl());
     QScopedPointer<QObject> root(component.create());
     if (!root) {
         QTextStream(stderr) << component.errorString();
         return 1;
     }
-    view.setContent(QUrl(), &component, root.data());
+    view.setContent(QUrl(), &component, root.take());
     view.resize(540, 960);
-    int frames = 0;
-    QElapsedTimer timer;
-    QObject::connect(&view, &QQuickWindow::frameSwapped, [&] {
-        if (++frames == 30) {
-            timer.start();
-            if (qEnvironmentVariableIsSet("PELKAN_BLUR_BENCH_GRAB"))
-                view.grabWindow().save(qEnvironmentVariable("PELKAN_BLUR_BENCH_GRAB") + kind + QLatin1String(".png"));
-        }
-        if (frames == 230) {
-            QTextStream(stdout) << "frame-ms " << timer.nsecsElapsed() / 1e6 / 200 << Qt::endl;
-            QCoreApplication::exit(0);
-        }
-        view.update();
+    return timeFrames(view, [&] {
+        if (qEnvironmentVariableIsSet("PELKAN_BLUR_BENCH_GRAB"))
+            view.grabWindow().save(qEnvironmentVariable("PELKAN_BLUR_BENCH_GRAB") + kind + QLatin1String(".png"));
     });
-    view.show();
-    root.take();
-    return QGuiApplication::exec();
 }
 
 double frameMs(const QString &program, const QString &kind)

@@ -20,6 +20,8 @@
 #include <QQmlEngine>
 #include <QQuickImageProvider>
 #include <QQuickView>
+
+#include "../common/frametiming.h"
 #include <QRegularExpression>
 #include <QTextStream>
 #include <QTimer>
@@ -99,20 +101,8 @@ int runPage(const QString &kind)
     }
     view.setContent(QUrl(), &component, root.data());
     view.resize(540, 960);
-    int frames = 0;
-    QElapsedTimer timer;
-    QObject::connect(&view, &QQuickWindow::frameSwapped, [&] {
-        if (++frames == 30)
-            timer.start(); // after loading settles
-        if (frames == 230) {
-            QTextStream(stdout) << "frame-ms " << timer.nsecsElapsed() / 1e6 / 200 << Qt::endl;
-            QCoreApplication::exit(0);
-        }
-        view.update();
-    });
-    view.show();
     root.take();
-    return QGuiApplication::exec();
+    return timeFrames(view);
 }
 
 } // namespace

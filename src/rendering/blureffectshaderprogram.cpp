@@ -1,16 +1,10 @@
 #include "blureffectshaderprogram.h"
 #include "blurkernel.h"
 #include "pelkanlogging.h"
+#include "shadersource.h"
 
-#include <QFile>
 
 namespace {
-
-QByteArray readShader(const char *name)
-{
-    QFile file(QLatin1String(":/quorvane/pelkan/shaders/") + QLatin1String(name));
-    return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray();
-}
 
 // weight0 ... weight(p + 1); the last is declared for the layout but never written.
 QByteArray weightVaryings(int pairs)
@@ -34,7 +28,7 @@ QByteArray BlurEffectShaderProgram::vertexSource(int pairs)
         assignments += "    " + name + ".y = ((" + first + ".0 + vertexDirection.w) * inputWeights[" + first + "] + (" + second
                 + ".0 + vertexDirection.w) * inputWeights[" + second + "]) * delta / " + name + ".x;\n";
     }
-    return readShader("blurpass.vert")
+    return readShaderSource("blurpass.vert")
             .replace("WEIGHT_COUNT", QByteArray::number(2 * (pairs + 1) + 1))
             .replace("WEIGHT_VARYINGS", weightVaryings(pairs))
             .replace("WEIGHT_ASSIGNMENTS", assignments);
@@ -48,7 +42,7 @@ QByteArray BlurEffectShaderProgram::fragmentSource(int pairs)
         fetches += "        + (texture2D(source, vec2(max(tx.x - " + name + ".y, limits.x), tx.y))\n"
                    "           + texture2D(source, vec2(min(tx.x + " + name + ".y, limits.y), tx.y))) * " + name + ".x\n";
     }
-    return readShader("blurpass.frag").replace("WEIGHT_VARYINGS", weightVaryings(pairs)).replace("PAIR_FETCHES", fetches);
+    return readShaderSource("blurpass.frag").replace("WEIGHT_VARYINGS", weightVaryings(pairs)).replace("PAIR_FETCHES", fetches);
 }
 
 BlurEffectShaderProgram::BlurEffectShaderProgram(int kernel)

@@ -1,19 +1,13 @@
 #include "glassmaterialshader.h"
 #include "glassmaterial.h"
+#include "shadersource.h"
 
-#include <QFile>
 #include <QMatrix4x4>
 #include <QOpenGLContext>
 #include <QOpenGLFunctions>
 #include <QSGTexture>
 
 namespace {
-
-QByteArray readShader(const char *name)
-{
-    QFile file(QLatin1String(":/quorvane/pelkan/shaders/") + QLatin1String(name));
-    return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray();
-}
 
 const char *dashCoordinate(int angle)
 {
@@ -32,8 +26,8 @@ const char *dashCoordinate(int angle)
 } // namespace
 
 GlassMaterialShader::GlassMaterialShader(int angle)
-    : m_vertex(readShader("glass.vert"))
-    , m_fragment(readShader("glass.frag").replace("DASH_COORDINATE", dashCoordinate(angle)))
+    : m_vertex(readShaderSource("glass.vert"))
+    , m_fragment(readShaderSource("glass.frag").replace("DASH_COORDINATE", dashCoordinate(angle)))
 {
 }
 
