@@ -20,11 +20,11 @@
 #include <QQmlEngine>
 #include <QQuickImageProvider>
 #include <QQuickView>
-
-#include "../common/frametiming.h"
 #include <QRegularExpression>
 #include <QTextStream>
 #include <QTimer>
+
+#include "../common/frametiming.h"
 
 #include <algorithm>
 #include <vector>
