@@ -1,4 +1,5 @@
 #include "declarativecoveractionlist.h"
+#include "coveractioncaller.h"
 #include "declarativecoveraction.h"
 #include "pelkanlogging.h"
 #include "windowpropertypublisher.h"
@@ -8,10 +9,6 @@
 #include <QDBusConnectionInterface>
 #include <QQuickItem>
 #include <QQuickWindow>
-
-#include <grp.h>
-#include <pwd.h>
-#include <sys/stat.h>
 
 namespace {
 
@@ -207,25 +204,12 @@ void DeclarativeCoverActionList::registerOnBus()
     qCDebug(lcPelkanCoverLog) << QStringLiteral("dbus ready %1").arg(m_serviceName);
 }
 
-bool DeclarativeCoverActionList::isPrivilegedProcess(uint pid)
-{
-    struct stat info;
-    if (::stat(QByteArray("/proc/" + QByteArray::number(pid)).constData(), &info) != 0)
-        return false;
-    if (const struct group *group = ::getgrgid(info.st_gid)) {
-        if (qstrcmp(group->gr_name, "privileged") == 0)
-            return true;
-    }
-    const struct passwd *owner = ::getpwuid(info.st_uid);
-    return owner && qstrcmp(owner->pw_name, "root") == 0;
-}
-
 void DeclarativeCoverActionList::trigger(int id)
 {
     if (calledFromDBus()) {
-        const uint pid = connection().interface()->servicePid(message().service()).value();
-        if (!isPrivilegedProcess(pid)) {
-            sendErrorReply(QDBusError::AccessDenied, QStringLiteral("PID %1 is not in privileged group").arg(pid));
+        const CoverActionCaller caller = CoverActionCaller::fromBus(connection(), message().service());
+        if (!caller.isPrivileged()) {
+            sendErrorReply(QDBusError::AccessDenied, QStringLiteral("PID %1 is not in privileged group").arg(caller.pid()));
             return;
         }
     }

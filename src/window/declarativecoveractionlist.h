@@ -27,8 +27,9 @@ class DeclarativeCoverAction;
 //   icon, iconBackground, and the window getting its native id.
 // - The list registers on the bus when its component completes, once.
 // - trigger() with an index that has no action is ignored with a warning. Callers over
-//   the bus must run in the group "privileged" or as root; others get an access-denied
-//   error. Direct calls from the application itself are not checked.
+//   the bus must have connected in the group "privileged" or as root and still run so
+//   (see CoverActionCaller); others get an access-denied error. Direct calls from the
+//   application itself are not checked.
 // - Disabling the list, moving it to another window or destroying it takes its entries
 //   (those naming its bus name) out of the window's payload and leaves other lists' alone.
 class DeclarativeCoverActionList : public QObject, public QQmlParserStatus, protected QDBusContext
@@ -71,9 +72,6 @@ public:
                                 const QList<QUrl> &icons, bool iconBackground);
     // payload without the entries of serviceName; entries that cannot be read are dropped.
     static QString removeEntries(const QString &payload, const QString &serviceName);
-    // Whether a process may press cover buttons: its /proc entry is in the group
-    // "privileged" or owned by root.
-    static bool isPrivilegedProcess(uint pid);
 
 public Q_SLOTS:
     Q_SCRIPTABLE void trigger(int id);

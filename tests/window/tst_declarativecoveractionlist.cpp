@@ -11,6 +11,11 @@
 #include <QtTest>
 
 #include <grp.h>
+#include <linux/sched.h>
+#include <signal.h>
+#include <sys/stat.h>
+#include <sys/syscall.h>
+#include <sys/wait.h>
 #include <unistd.h>
 
 // A private bus that, unlike an ordinary session bus, admits every user: the caller check
@@ -44,6 +49,8 @@ private Q_SLOTS:
     void triggerFromPrivilegedCaller();
     void triggerFromAnotherUser_data();
     void triggerFromAnotherUser();
+    void forgedCallerIsRefused_data();
+    void forgedCallerIsRefused();
     void payload_data();
     void payload();
     void removeEntries_data();
@@ -192,6 +199,83 @@ void tst_DeclarativeCoverActionList::triggerFromAnotherUser()
         QVERIFY2(errors.contains(QRegularExpression(QStringLiteral("PID \\d+ is not in privileged group"))), qPrintable(errors));
         QCOMPARE(triggered.count(), 0);
     }
+}
+
+// A root process that takes the given pid, as a later process would when pids wrap round.
+static pid_t startRootProcessWithPid(pid_t pid)
+{
+    struct clone_args args;
+    memset(&args, 0, sizeof args);
+    args.exit_signal = SIGCHLD;
+    pid_t wanted = pid;
+    args.set_tid = quint64(quintptr(&wanted));
+    args.set_tid_size = 1;
+    const long made = ::syscall(SYS_clone3, &args, sizeof args);
+    if (made == 0) {
+        ::execl("/bin/sleep", "sleep", "30", static_cast<char *>(nullptr));
+        ::_exit(127);
+    }
+    return pid_t(made);
+}
+
+void tst_DeclarativeCoverActionList::forgedCallerIsRefused_data()
+{
+    QTest::addColumn<QString>("mode");
+    QTest::newRow("connection handed to a child, parent runs a set-uid program") << "setuid";
+    QTest::newRow("connection kept by a child, a root process reuses the pid") << "pidreuse";
+}
+
+void tst_DeclarativeCoverActionList::forgedCallerIsRefused()
+{
+    QFETCH(QString, mode);
+    if (::getuid() != 0)
+        QSKIP("running a caller under another uid needs root");
+    // The programs are copied where user 65534 may run them; the set-uid one blocks.
+    const QString caller = m_busDir.filePath(QStringLiteral("forgedcaller"));
+    const QString blocker = m_busDir.filePath(QStringLiteral("setuid-sleep"));
+    if (!QFile::exists(caller)) {
+        QVERIFY(QFile::copy(QStringLiteral(FORGED_CALLER), caller));
+        QVERIFY(QFile::copy(QStringLiteral("/bin/sleep"), blocker));
+        QVERIFY(::chmod(QFile::encodeName(blocker).constData(), 04755) == 0);
+    }
+    // The caller writes its answer where user 65534 may write.
+    const QString results = m_busDir.filePath(QStringLiteral("results"));
+    QVERIFY(QDir().mkpath(results));
+    QVERIFY(::chmod(QFile::encodeName(results).constData(), 0777) == 0);
+    const QString result = results + QStringLiteral("/") + mode;
+
+    DeclarativeCoverActionList *list = makeList(1);
+    QSignalSpy triggered(list->actionList().first(), &DeclarativeCoverAction::triggered);
+    QStringList arguments { QStringLiteral("--reuid=65534"), QStringLiteral("--regid=65534"), QStringLiteral("--clear-groups"),
+                            caller, mode, m_address, list->serviceName(), list->objectPath(), result };
+    if (mode == QLatin1String("setuid"))
+        arguments << blocker;
+    QProcess opener;
+    opener.start(QStringLiteral("setpriv"), arguments);
+    QVERIFY(opener.waitForStarted());
+
+    pid_t reused = 0;
+    if (mode == QLatin1String("pidreuse")) {
+        QVERIFY(opener.waitForFinished(10000));
+        QFile pidFile(result + QStringLiteral(".pid"));
+        QVERIFY(pidFile.open(QIODevice::ReadOnly));
+        reused = startRootProcessWithPid(pid_t(pidFile.readAll().toInt()));
+        if (reused < 0)
+            QSKIP("this kernel does not let root choose a pid (clone3 with set_tid)");
+    }
+    QFile answer(result);
+    QTRY_VERIFY2_WITH_TIMEOUT(answer.exists(), opener.readAllStandardError().constData(), 15000);
+    opener.kill();
+    opener.waitForFinished();
+    if (reused > 0) {
+        ::kill(reused, SIGKILL);
+        ::waitpid(reused, nullptr, 0);
+    }
+    QVERIFY(answer.open(QIODevice::ReadOnly));
+    const QString text = QString::fromUtf8(answer.readAll());
+    QVERIFY2(text.startsWith(QLatin1String("org.freedesktop.DBus.Error.AccessDenied\n")), qPrintable(text));
+    QVERIFY2(text.contains(QRegularExpression(QStringLiteral("PID \\d+ is not in privileged group"))), qPrintable(text));
+    QCOMPARE(triggered.count(), 0);
 }
 
 void tst_DeclarativeCoverActionList::payload_data()
