@@ -6,6 +6,8 @@
 #include <QLocale>
 #include <QTranslator>
 
+#include <limits>
+
 namespace {
 
 // The one locale every operation formats with, fixed when the library is loaded.
@@ -125,6 +127,34 @@ bool formatDurationPattern(const QString &pattern, int hours, const QTime &rest,
         i += run - 1;
     }
     return true;
+}
+
+// The pattern with its hour fields ("h", or "hh" padded to two digits) written out as
+// the hour count, so that hours never wrap at 24; quoted text stays as it is. The count is
+// spliced in as text: a digit that follows the field in the pattern stays a literal.
+QString withHours(const QString &pattern, int hours)
+{
+    const QLocale locale;
+    const QString plain = locale.toString(hours);
+    QString padded = plain;
+    if (hours >= 0 && hours < 10)
+        padded.prepend(locale.zeroDigit());
+    QString result;
+    result.reserve(pattern.size() + plain.size());
+    bool quoted = false;
+    for (int i = 0; i < pattern.size(); ++i) {
+        const QChar c = pattern.at(i);
+        if (c == QLatin1Char('\'')) {
+            quoted = !quoted;
+        } else if (!quoted && c == QLatin1Char('h')) {
+            const bool pair = i + 1 < pattern.size() && pattern.at(i + 1) == c;
+            result.append(pair ? padded : plain);
+            i += pair ? 1 : 0;
+            continue;
+        }
+        result.append(c);
+    }
+    return result;
 }
 
 } // namespace
@@ -263,19 +293,22 @@ QString DeclarativeFormatter::elapsed(const QDateTime &dateTime, const QDate &to
         return QString();
 
     // Whole months from the earlier date to the later one, any part month counted as one.
+    // Dates may lie billions of years apart: count in 64 bits and show at most INT_MAX.
     QDate from = qMin(date, today);
     const QDate to = qMax(date, today);
-    const int years = to.year() - from.year();
+    const qint64 years = qint64(to.year()) - from.year();
+    if (years - 1 > (std::numeric_limits<int>::max() - 24) / 12)
+        return text(Months, std::numeric_limits<int>::max());
     int months = 0;
     if (years >= 2) {
-        from = from.addYears(years - 1);
-        months = 12 * (years - 1);
+        from = from.addYears(int(years - 1));
+        months = 12 * int(years - 1);
     }
     if (years >= 1 && from.addYears(1) < to) {
         from = from.addYears(1);
         months += 12;
     }
-    while (from < to) {
+    while (from.isValid() && from < to && months < std::numeric_limits<int>::max()) {
         from = from.addMonths(1);
         ++months;
     }
@@ -392,15 +425,7 @@ QString DeclarativeFormatter::formatDuration(int seconds, int formatType) const
     if (formatDurationPattern(pattern, hours, QTime(0, 0).addSecs(rest), s_formattingLocale, &text))
         return text;
 
-    // Hours go in as a number so that they never wrap at 24.
-    if (pattern.contains(QLatin1String("hh"))) {
-        pattern.replace(QLatin1String("hh"), QLatin1String("%L1"));
-        pattern = pattern.arg(hours, 2, 10, QLocale().zeroDigit());
-    } else if (pattern.contains(QLatin1Char('h'))) {
-        pattern.replace(QLatin1Char('h'), QLatin1String("%L1"));
-        pattern = pattern.arg(hours, 0, 10, QLatin1Char(' '));
-    }
-    return s_formattingLocale.toString(QTime(0, 0).addSecs(rest), pattern);
+    return s_formattingLocale.toString(QTime(0, 0).addSecs(rest), withHours(pattern, hours));
 }
 
 QString DeclarativeFormatter::formatFileSize(qlonglong bytes, int precision) const
@@ -409,6 +434,7 @@ QString DeclarativeFormatter::formatFileSize(qlonglong bytes, int precision) con
         return QString::number(bytes, 10);
     if (precision < 0)
         precision = 1;
+    precision = qMin(precision, MaxFileSizePrecision);
     if (bytes < 100)
         return qtTrId("quorvanepelkan-bytes", int(bytes));
 

@@ -52,11 +52,15 @@ public:
     explicit DeclarativeFormatter(QObject *parent = nullptr);
     ~DeclarativeFormatter() override;
 
+    // The most digits after the point that formatFileSize writes: all a double holds.
+    static constexpr int MaxFileSizePrecision = 17;
+
 public Q_SLOTS:
     void updateHourMode();
     QString formatDate(const QDateTime &dateTime, int formatType) const;
     QString formatArticle(int articleType) const;
     QString formatDuration(int seconds, int formatType) const;
+    // precision: digits after the point; negative means 1, at most MaxFileSizePrecision.
     QString formatFileSize(qlonglong bytes, int precision = 1) const;
     QString formatText(const QString &input, int formatType) const;
     bool _needsSpaceBetweenNames(const QString &first, const QString &second) const;

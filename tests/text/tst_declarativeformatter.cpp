@@ -11,6 +11,15 @@ static const QString HourModeKey = QStringLiteral("/quorvane/i18n/lc_timeformat2
 // Sunday 15 March 2026, noon.
 static const QDateTime Now(QDate(2026, 3, 15), QTime(12, 0));
 
+// A catalogue whose texts a test sets, installed over the real one.
+class PatternCatalogue : public QTranslator
+{
+public:
+    QHash<QByteArray, QString> texts;
+    bool isEmpty() const override { return texts.isEmpty(); }
+    QString translate(const char *, const char *id, const char *, int) const override { return texts.value(id); }
+};
+
 class tst_DeclarativeFormatter : public QObject
 {
     Q_OBJECT
@@ -32,6 +41,8 @@ private Q_SLOTS:
     void formatDuration_data();
     void formatDuration();
     void durationSweepMatchesLocale();
+    void translatedPatterns_data();
+    void translatedPatterns();
     void formatText_data();
     void formatText();
     void joinNames_data();
@@ -102,6 +113,10 @@ void tst_DeclarativeFormatter::elapsed_data()
     QTest::newRow("months ahead") << Now << Now.addMonths(3) << L << "in 3 months";
     QTest::newRow("short, hours") << Now << Now.addSecs(-2 * 3600) << S << "2 h ago";
     QTest::newRow("short, ahead") << Now << Now.addDays(3) << S << "in 3 d";
+    QTest::newRow("179 million years ago") << Now << QDateTime(QDate(-179000000, 1, 1), QTime(12, 0)) << L
+                                           << "2147483647 months ago";
+    QTest::newRow("179 million years ahead") << Now << QDateTime(QDate(179000000, 1, 1), QTime(12, 0)) << L
+                                             << "in 2147483647 months";
 }
 
 void tst_DeclarativeFormatter::elapsed()
@@ -219,6 +234,7 @@ void tst_DeclarativeFormatter::formatFileSize_data()
     QTest::newRow("precision 2") << 1536LL << 2 << "1.50 kB";
     QTest::newRow("negative precision") << 1024LL << -3 << "1.0 kB";
     QTest::newRow("negative size") << -5LL << 1 << "-5";
+    QTest::newRow("precision past a double's digits") << 1536LL << 2147483647 << "1.50000000000000000 kB";
 }
 
 void tst_DeclarativeFormatter::formatFileSize()
@@ -264,6 +280,34 @@ void tst_DeclarativeFormatter::durationSweepMatchesLocale()
                  QString::number(seconds / 3600) + QLatin1Char(':') + locale.toString(rest, QStringLiteral("mm:ss")));
         QCOMPARE(formatter.formatDuration(seconds, F::DurationShort), locale.toString(rest, QStringLiteral("m:ss")));
     }
+}
+
+void tst_DeclarativeFormatter::translatedPatterns_data()
+{
+    QTest::addColumn<QByteArray>("id");
+    QTest::addColumn<QString>("translation");
+    QTest::addColumn<qlonglong>("value"); // seconds of a long duration, or bytes
+    QTest::addColumn<QString>("expected");
+    const QByteArray duration("quorvanepelkan-duration_long_format");
+    QTest::newRow("digit after the hours") << duration << "h9" << 3600LL << "19";
+    QTest::newRow("digit after the hours, quoted text") << duration << "h9 'min' mm" << 3660LL << "19 min 01";
+    QTest::newRow("padded hours and a digit") << duration << "hh0'h'" << 3600LL << "010h";
+    QTest::newRow("an h inside quotes stays") << duration << "h 'hours'" << 7200LL << "2 hours";
+}
+
+void tst_DeclarativeFormatter::translatedPatterns()
+{
+    QFETCH(QByteArray, id);
+    QFETCH(QString, translation);
+    QFETCH(qlonglong, value);
+    QFETCH(QString, expected);
+    PatternCatalogue catalogue;
+    catalogue.texts.insert(id, translation);
+    QCoreApplication::installTranslator(&catalogue);
+    const QString text = id.contains("duration") ? F().formatDuration(int(value), F::DurationLong)
+                                                 : F().formatFileSize(value);
+    QCoreApplication::removeTranslator(&catalogue);
+    QCOMPARE(text, expected);
 }
 
 void tst_DeclarativeFormatter::formatText_data()
