@@ -1,10 +1,10 @@
 #include "tolothumbnailcache.h"
+#include "boundedimagereader.h"
 #include "pelkanlogging.h"
 
 #include <QCryptographicHash>
 #include <QDir>
 #include <QFileInfo>
-#include <QImageReader>
 #include <QSaveFile>
 
 ToloThumbnailCache::ToloThumbnailCache(const QString &cacheDirectory)
@@ -50,11 +50,17 @@ ToloThumbnailCache::ThumbnailData ToloThumbnailCache::generateThumbnail(const QS
 
 QImage ToloThumbnailCache::readImageThumbnail(const QString &source, const QSize &size, bool crop, bool unbounded)
 {
-    QImageReader reader(source);
+    BoundedImageReader file(source);
+    const BoundedImageReader::Status status = file.open();
+    QImageReader &reader = file.reader();
     reader.setAutoTransform(true);
-    QSize natural = reader.size();
-    if (!natural.isValid()) {
-        qCWarning(lcPelkanCoreLog) << "Thumbnail: cannot read" << source << ":" << reader.errorString();
+    QSize natural = file.declaredSize();
+    if (status == BoundedImageReader::Ready && natural.isEmpty())
+        reader.read(); // sets the error the warning below gives
+    if (status != BoundedImageReader::Ready || natural.isEmpty()) {
+        if (status != BoundedImageReader::NotRegularFile && status != BoundedImageReader::TooLarge)
+            qCWarning(lcPelkanCoreLog) << "Thumbnail: cannot read" << source << ":"
+                                       << (status == BoundedImageReader::Missing ? QStringLiteral("file not found") : reader.errorString());
         return {};
     }
     if (reader.transformation() & QImageIOHandler::TransformationRotate90)
@@ -69,6 +75,7 @@ QImage ToloThumbnailCache::readImageThumbnail(const QString &source, const QSize
         target.setHeight(qMax(1, qRound(qreal(natural.height()) * target.width() / natural.width())));
     if (!unbounded && (target.width() > natural.width() || target.height() > natural.height()))
         target.scale(natural, Qt::KeepAspectRatio);
+    target = BoundedImageReader::bounded(target);
 
     const QSize scaled = natural.scaled(target, crop ? Qt::KeepAspectRatioByExpanding : Qt::KeepAspectRatio);
     QImage image = reader.read();

@@ -1,6 +1,6 @@
 #include "backgroundimagecache.h"
+#include "boundedimagereader.h"
 
-#include <QImageReader>
 #include <QStandardPaths>
 
 BackgroundImageCache::BackgroundImageCache()
@@ -21,9 +21,11 @@ ToloThumbnailCache::ThumbnailData BackgroundImageCache::generateThumbnail(const 
     QSize target(size.width() > 0 ? qMax(4, size.width()) : 0, size.height() > 0 ? qMax(4, size.height()) : 0);
 
     const qreal scale = m_background.appScaleFactor();
-    QImageReader reader(source);
-    reader.setAutoTransform(true);
-    const QSize largest = reader.size() * scale;
+    BoundedImageReader file(source);
+    const BoundedImageReader::Status status = file.open();
+    if (status == BoundedImageReader::NotRegularFile || status == BoundedImageReader::TooLarge)
+        return {}; // reported by the reader
+    const QSize largest = file.declaredSize() * scale;
     if (largest.isValid() && (target.width() > largest.width() || target.height() > largest.height()))
         target = target.scaled(largest, Qt::KeepAspectRatio);
 

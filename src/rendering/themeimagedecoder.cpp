@@ -1,9 +1,9 @@
 #include "themeimagedecoder.h"
+#include "boundedimagereader.h"
 #include "pelkanlogging.h"
 #include "theme.h"
 #include "themepixels.h"
 
-#include <QImageReader>
 
 QColor ThemeImageRecord::effectiveColor() const
 {
@@ -31,7 +31,13 @@ ThemeImageRecord parseId(const QString &id)
 
 QImage decode(const QString &path, ThemeImageRecord &record, const QSize &requestedSize)
 {
-    QImageReader reader(path);
+    BoundedImageReader file(path);
+    const BoundedImageReader::Status status = file.open();
+    if (status == BoundedImageReader::Unreadable)
+        qCWarning(lcPelkanCoreLog) << "Failed to load" << path << file.reader().errorString();
+    if (status != BoundedImageReader::Ready)
+        return QImage();
+    QImageReader &reader = file.reader();
     if (record.color.isValid()) {
         record.tint = ThemeImageRecord::Colour;
     } else if (reader.text(QStringLiteral("Grayscale")) == QLatin1String("true")) {
@@ -41,12 +47,11 @@ QImage decode(const QString &path, ThemeImageRecord &record, const QSize &reques
         record.tint = ThemeImageRecord::Copy;
     }
     if (requestedSize.width() > 0 && requestedSize.height() > 0)
-        reader.setScaledSize(requestedSize);
+        reader.setScaledSize(BoundedImageReader::bounded(requestedSize));
 
     const QImage image = reader.read();
     if (image.isNull()) {
-        if (reader.error() != QImageReader::FileNotFoundError)
-            qCWarning(lcPelkanCoreLog) << "Failed to load" << reader.fileName() << reader.errorString();
+        qCWarning(lcPelkanCoreLog) << "Failed to load" << path << reader.errorString();
         return QImage();
     }
     record.imageSize = image.size();

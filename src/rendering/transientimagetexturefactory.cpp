@@ -1,7 +1,7 @@
 #include "transientimagetexturefactory.h"
+#include "boundedimagereader.h"
 #include "pelkanlogging.h"
 
-#include <QImageReader>
 #include <QQuickWindow>
 
 TransientImageTextureFactory::TransientImageTextureFactory(const QString &path, const QSize &requestedSize)
@@ -18,14 +18,21 @@ bool TransientImageTextureFactory::dropsDecodedImages()
 
 void TransientImageTextureFactory::decode() const
 {
-    QImageReader reader(m_path);
-    if (m_requestedSize.width() > 0 && m_requestedSize.height() > 0)
-        reader.setScaledSize(m_requestedSize);
-    m_image = reader.read();
+    BoundedImageReader file(m_path);
+    const BoundedImageReader::Status status = file.open();
+    QImageReader &reader = file.reader();
+    if (status == BoundedImageReader::Ready) {
+        if (m_requestedSize.width() > 0 && m_requestedSize.height() > 0)
+            reader.setScaledSize(BoundedImageReader::bounded(m_requestedSize));
+        m_image = reader.read();
+    }
     m_size = m_image.size();
-    // An unreadable file is reported once, not again at every texture request.
-    if (m_image.isNull() && !m_decoded)
-        qCWarning(lcPelkanCoreLog) << "TransientImageProvider: cannot read" << m_path << ":" << reader.errorString();
+    // An unreadable file is reported once, not again at every texture request; files
+    // refused for their kind or size were reported by the reader.
+    const bool refused = status == BoundedImageReader::NotRegularFile || status == BoundedImageReader::TooLarge;
+    if (m_image.isNull() && !m_decoded && !refused)
+        qCWarning(lcPelkanCoreLog) << "TransientImageProvider: cannot read" << m_path << ":"
+                                   << (status == BoundedImageReader::Missing ? QStringLiteral("file not found") : reader.errorString());
     m_decoded = true;
 }
 
