@@ -1,4 +1,5 @@
 #include "theme.h"
+#include "configvalue.h"
 #include "mgconfitem.h"
 #include "pelkanlogging.h"
 #include "screen.h"
@@ -144,15 +145,31 @@ Theme::State Theme::readState() const
     return state;
 }
 
+bool Theme::isNewRefusal(const MGConfItem *item, const QVariant &value) const
+{
+    auto known = m_refused.constFind(item->key());
+    if (known != m_refused.constEnd() && *known == value && known->userType() == value.userType())
+        return false;
+    m_refused.insert(item->key(), value);
+    return true;
+}
+
+void Theme::forgetRefusal(const MGConfItem *item) const
+{
+    m_refused.remove(item->key());
+}
+
 qreal Theme::readPixelRatio() const
 {
     const QVariant configured = m_pixelRatioConfig->value();
     if (configured.isValid()) {
-        bool ok = false;
-        const qreal ratio = configured.toReal(&ok);
-        if (ok && ratio > 0 && ratio <= 10)
+        qreal ratio = 0;
+        if (ConfigValue::toReal(configured, &ratio) && ratio >= MinPixelRatio && ratio <= MaxPixelRatio) {
+            forgetRefusal(m_pixelRatioConfig);
             return ratio;
-        qCWarning(lcPelkanThemeLog) << "Theme: ignoring invalid pixel ratio" << configured;
+        }
+        if (isNewRefusal(m_pixelRatioConfig, configured))
+            qCWarning(lcPelkanThemeLog) << "Theme: ignoring invalid pixel ratio" << configured;
     }
     // Quarter steps keep metrics on whole pixels for the common display widths.
     return qMax<qreal>(1.0, qRound(Screen::instance()->widthRatio() * 4) / 4.0);
@@ -163,36 +180,56 @@ Theme::ColorScheme Theme::readScheme() const
     const QVariant configured = m_schemeConfig->value();
     if (!configured.isValid())
         return LightOnDark;
-    const QString name = configured.toString().toLower();
-    if (name == QLatin1String("lightondark"))
-        return LightOnDark;
-    if (name == QLatin1String("darkonlight"))
-        return DarkOnLight;
-    qCWarning(lcPelkanThemeLog) << "Theme: ignoring invalid colour scheme" << configured;
+    QString name;
+    if (ConfigValue::toString(configured, &name)) {
+        name = name.toLower();
+        if (name == QLatin1String("lightondark") || name == QLatin1String("darkonlight")) {
+            forgetRefusal(m_schemeConfig);
+            return name == QLatin1String("darkonlight") ? DarkOnLight : LightOnDark;
+        }
+    }
+    if (isNewRefusal(m_schemeConfig, configured))
+        qCWarning(lcPelkanThemeLog) << "Theme: ignoring invalid colour scheme" << configured;
     return LightOnDark;
 }
 
 QColor Theme::readColor(ColorRole role, const QColor &fallback) const
 {
-    const QVariant configured = m_colorConfig.at(role)->value();
+    const MGConfItem *item = m_colorConfig.at(role);
+    const QVariant configured = item->value();
     if (!configured.isValid())
         return fallback;
-    const QColor color(configured.toString());
-    if (color.isValid())
+    QString name;
+    const QColor color = ConfigValue::toString(configured, &name) ? QColor(name) : QColor();
+    if (color.isValid()) {
+        forgetRefusal(item);
         return color;
-    qCWarning(lcPelkanThemeLog) << "Theme: ignoring invalid colour" << configured << "in"
-                                << m_colorConfig.at(role)->key();
+    }
+    if (isNewRefusal(item, configured))
+        qCWarning(lcPelkanThemeLog) << "Theme: ignoring invalid colour" << configured << "in" << item->key();
     return fallback;
 }
 
 QString Theme::readDirectory() const
 {
     const QVariant configured = m_directoryConfig->value();
-    if (configured.isValid()) {
-        const QString path = configured.toString();
-        if (QFileInfo(path).isDir())
-            return QDir::cleanPath(path);
-        qCWarning(lcPelkanThemeLog) << "Theme: ignoring missing theme directory" << path;
+    if (!configured.isValid())
+        return defaultThemeDirectory();
+    QString path;
+    const bool absolute = ConfigValue::toString(configured, &path) && QDir::isAbsolutePath(path);
+    const QString real = absolute ? QFileInfo(path).canonicalFilePath() : QString();
+    const bool system = real == QLatin1String("/proc") || real.startsWith(QLatin1String("/proc/"))
+            || real == QLatin1String("/sys") || real.startsWith(QLatin1String("/sys/"))
+            || real == QLatin1String("/dev") || real.startsWith(QLatin1String("/dev/"));
+    if (!real.isEmpty() && !system && QFileInfo(real).isDir()) {
+        forgetRefusal(m_directoryConfig);
+        return QDir::cleanPath(path);
+    }
+    if (isNewRefusal(m_directoryConfig, configured)) {
+        if (absolute && real.isEmpty())
+            qCWarning(lcPelkanThemeLog) << "Theme: ignoring missing theme directory" << path;
+        else
+            qCWarning(lcPelkanThemeLog) << "Theme: ignoring invalid theme directory" << configured;
     }
     return defaultThemeDirectory();
 }

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <QColor>
+#include <QHash>
 #include <QObject>
 #include <QSize>
 #include <QVector>
@@ -13,16 +14,19 @@ namespace Pelkan {
 //
 // Everything is read from configuration keys below "/desktop/quorvane/pelkan/theme/"
 // and follows them while the application runs:
-//   pixel_ratio                  double; unset: the screen's width over 540, in quarter steps
+//   pixel_ratio                  a number from MinPixelRatio to MaxPixelRatio; unset: the
+//                                screen's width over 540, in quarter steps
 //   color_scheme                 "lightondark" (default) or "darkonlight"
 //   primary_color, secondary_color, highlight_color, secondary_highlight_color,
 //   highlight_background_color, overlay_background_color
 //                                any colour QColor parses ("#rrggbb", "#aarrggbb", names);
 //                                unset colours derive from the scheme and from each other
-//   directory                    the theme folder (icons/, graphics/); unset: the default theme
+//   directory                    the theme folder (icons/, graphics/), an absolute path that
+//                                is not below /proc, /sys or /dev; unset: the default theme
 // Metrics are the reference design's pixel sizes multiplied by the pixel ratio, and all
-// announce their change through pixelRatioChanged(). Invalid values are ignored with a
-// warning and the default is used.
+// announce their change through pixelRatioChanged(). Invalid values, and values of the
+// wrong type, are ignored with a warning and the default is used; the warning is given
+// once per value, not again whenever another key changes.
 class Theme : public QObject
 {
     Q_OBJECT
@@ -68,6 +72,10 @@ public:
     Q_ENUM(ColorRole)
 
     static Theme *instance();
+
+    // The pixel ratios a configuration may set; outside them covers and metrics collapse.
+    static constexpr qreal MinPixelRatio = 0.5;
+    static constexpr qreal MaxPixelRatio = 5.0;
 
     explicit Theme(QObject *parent = nullptr);
     ~Theme() override;
@@ -130,6 +138,11 @@ private:
         QString directory;
     };
 
+    // Whether a refused value of item is new, so worth a warning; forgetRefusal() when the
+    // key holds a good value again.
+    bool isNewRefusal(const MGConfItem *item, const QVariant &value) const;
+    void forgetRefusal(const MGConfItem *item) const;
+
     qreal scaled(qreal size) const { return size * m_state.pixelRatio; }
     QSize scaledSize(int width, int height) const;
     void reload();
@@ -144,6 +157,7 @@ private:
     MGConfItem *m_schemeConfig;
     MGConfItem *m_directoryConfig;
     State m_state;
+    mutable QHash<QString, QVariant> m_refused; // key -> the value last warned about
 };
 
 } // namespace Pelkan

@@ -19,7 +19,8 @@ void DeclarativeCoverActionArea::updateGeometry()
     if (!cover)
         return;
     Pelkan::Theme *theme = Pelkan::Theme::instance();
-    const qreal scale = cover->width() / theme->coverSizeLarge().width();
+    const int largeWidth = theme->coverSizeLarge().width();
+    const qreal scale = largeWidth > 0 ? cover->width() / largeWidth : 0.0;
     setWidth(cover->width());
     const qreal half = std::round(cover->width() * 0.5);
     const int height = int(theme->itemSizeSmall() * scale);

@@ -1,4 +1,5 @@
 #include "declarativewindow.h"
+#include "configvalue.h"
 #include "mgconfitem.h"
 #include "pelkanlogging.h"
 #include "screen.h"
@@ -78,8 +79,8 @@ void DeclarativeWindow::readConfiguration()
 {
     const QVariant angle = MGConfItem(QStringLiteral("/desktop/kavoa/components/screen_rotation_angle")).value();
     if (angle.isValid()) {
-        bool ok = false;
-        const int degrees = angle.toInt(&ok);
+        int degrees = 0;
+        const bool ok = ConfigValue::toInt(angle, &degrees);
         if (ok && degrees % 90 == 0)
             s_screenRotation = degrees;
         else if (ok)
@@ -97,9 +98,8 @@ void DeclarativeWindow::readConfiguration()
 
     const QVariant allowed = MGConfItem(QStringLiteral("/desktop/quorvane/pelkan/default_allowed_orientations")).value();
     if (allowed.isValid()) {
-        bool ok = false;
-        const int value = allowed.toInt(&ok);
-        if (ok && value > 0 && value <= DeclarativeOrientation::All) {
+        int value = 0;
+        if (ConfigValue::toInt(allowed, &value) && value > 0 && value <= DeclarativeOrientation::All) {
             m_defaultAllowedOrientations = Orientations(value);
         } else {
             qCWarning(lcPelkanCoreLog) << "Invalid default allowed orientations defined. Check your device configuration! Defaulting to:"

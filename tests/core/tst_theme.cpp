@@ -28,11 +28,10 @@ private Q_SLOTS:
 
     void metricsScaleWithPixelRatio_data();
     void metricsScaleWithPixelRatio();
-    void invalidPixelRatioFallsBack_data();
-    void invalidPixelRatioFallsBack();
+    void refusedValues_data();
+    void refusedValues();
     void colourFollowsConfiguration();
     void derivedColoursFollowTheirBase();
-    void invalidColourIsIgnored();
     void colourSchemeChangesDefaults();
     void themeDirectory();
     void highlightText_data();
@@ -68,28 +67,73 @@ void tst_Theme::metricsScaleWithPixelRatio()
     QCOMPARE(colourChanged.count(), 0);
 }
 
-void tst_Theme::invalidPixelRatioFallsBack_data()
+namespace {
+QStringList s_warnings;
+void collectWarnings(QtMsgType type, const QMessageLogContext &, const QString &text)
 {
+    if (type == QtWarningMsg)
+        s_warnings << text;
+}
+} // namespace
+
+void tst_Theme::refusedValues_data()
+{
+    QTest::addColumn<QByteArray>("name");
     QTest::addColumn<QString>("value");
-    QTest::newRow("negative") << "-1.0";
-    QTest::newRow("zero") << "0.0";
-    QTest::newRow("text") << "'big'";
+    QTest::addColumn<QString>("warning");
+    const QString ratio = QStringLiteral("^Theme: ignoring invalid pixel ratio");
+    const QString directory = QStringLiteral("^Theme: ignoring invalid theme directory");
+    QTest::newRow("ratio negative") << QByteArray("pixel_ratio") << "-1.0" << ratio;
+    QTest::newRow("ratio zero") << QByteArray("pixel_ratio") << "0.0" << ratio;
+    QTest::newRow("ratio 0.001") << QByteArray("pixel_ratio") << "0.001" << ratio;
+    QTest::newRow("ratio 100") << QByteArray("pixel_ratio") << "100.0" << ratio;
+    QTest::newRow("ratio text") << QByteArray("pixel_ratio") << "'big'" << ratio;
+    QTest::newRow("ratio boolean") << QByteArray("pixel_ratio") << "true" << ratio;
+    QTest::newRow("directory /proc/self") << QByteArray("directory") << "'/proc/self'" << directory;
+    QTest::newRow("directory relative") << QByteArray("directory") << "'../..'" << directory;
+    QTest::newRow("directory boolean") << QByteArray("directory") << "true" << directory;
+    QTest::newRow("directory missing") << QByteArray("directory") << "'/nonexistent/theme'"
+                                       << "^Theme: ignoring missing theme directory";
+    QTest::newRow("scheme boolean") << QByteArray("color_scheme") << "true" << "^Theme: ignoring invalid colour scheme";
+    QTest::newRow("colour text") << QByteArray("highlight_color") << "'not a colour'"
+                                 << "^Theme: ignoring invalid colour.*highlight_color";
+    QTest::newRow("colour number") << QByteArray("highlight_color") << "5" << "^Theme: ignoring invalid colour.*highlight_color";
 }
 
-void tst_Theme::invalidPixelRatioFallsBack()
+// A refused value leaves the default in place, and is warned about once: not again when
+// another key changes.
+void tst_Theme::refusedValues()
 {
+    QFETCH(QByteArray, name);
     QFETCH(QString, value);
-    QVERIFY(ConfigFixture::reset(key("pixel_ratio")));
-    Theme reference;
-    const qreal fallback = reference.pixelRatio();
-    QVERIFY(fallback >= 1.0);
+    QFETCH(QString, warning);
+    QVERIFY(ConfigFixture::reset(key(name.constData())));
+    Theme theme; // with the key's default
+    const qreal ratio = theme.pixelRatio();
+    const QString directory = theme.themeDirectory();
+    const QColor highlight = theme.highlightColor();
+    const Theme::ColorScheme scheme = theme.colorScheme();
+    QSignalSpy primaryChanged(&theme, &Theme::primaryColorChanged);
 
-    Theme theme;
-    QTest::ignoreMessage(QtWarningMsg, QRegularExpression(QStringLiteral("^Theme: ignoring invalid pixel ratio")));
-    QVERIFY(ConfigFixture::write(key("pixel_ratio"), value));
-    QTRY_VERIFY(MGConfItem(key("pixel_ratio")).value().isValid());
-    QTest::qWait(100);
-    QCOMPARE(theme.pixelRatio(), fallback);
+    s_warnings.clear();
+    const QtMessageHandler previous = qInstallMessageHandler(collectWarnings);
+    const QRegularExpression pattern(warning);
+    auto matching = [&pattern] { return s_warnings.filter(pattern).size(); };
+    const bool written = ConfigFixture::write(key(name.constData()), value);
+    QTRY_VERIFY(matching() >= 1); // this theme's and Theme::instance()'s, once each
+    const int warned = matching();
+    QVERIFY(ConfigFixture::write(key("primary_color"), QStringLiteral("'#123456'")));
+    QTRY_COMPARE(primaryChanged.count(), 1);
+    QTest::qWait(50);
+    qInstallMessageHandler(previous);
+
+    QVERIFY(written);
+    QCOMPARE(matching(), warned);
+    QVERIFY(warned <= 2);
+    QCOMPARE(theme.pixelRatio(), ratio);
+    QCOMPARE(theme.themeDirectory(), directory);
+    QCOMPARE(theme.highlightColor(), highlight);
+    QCOMPARE(theme.colorScheme(), scheme);
 }
 
 void tst_Theme::colourFollowsConfiguration()
@@ -131,19 +175,6 @@ void tst_Theme::derivedColoursFollowTheirBase()
     QTRY_COMPARE(theme.secondaryHighlightColor(), QColor(QStringLiteral("#80112233")));
 }
 
-void tst_Theme::invalidColourIsIgnored()
-{
-    Theme theme;
-    const QColor before = theme.highlightColor();
-    QSignalSpy changed(&theme, &Theme::highlightColorChanged);
-    QTest::ignoreMessage(QtWarningMsg, QRegularExpression(QStringLiteral("^Theme: ignoring invalid colour.*highlight_color")));
-    QVERIFY(ConfigFixture::write(key("highlight_color"), QStringLiteral("'not a colour'")));
-    QTRY_VERIFY(MGConfItem(key("highlight_color")).value().isValid());
-    QTest::qWait(100);
-    QCOMPARE(theme.highlightColor(), before);
-    QCOMPARE(changed.count(), 0);
-}
-
 void tst_Theme::colourSchemeChangesDefaults()
 {
     Theme theme;
@@ -173,8 +204,7 @@ void tst_Theme::themeDirectory()
     QTRY_COMPARE(changed.count(), 1);
     QCOMPARE(theme.themeDirectory(), custom.path());
 
-    QTest::ignoreMessage(QtWarningMsg, QRegularExpression(QStringLiteral("^Theme: ignoring missing theme directory")));
-    QVERIFY(ConfigFixture::write(key("directory"), QStringLiteral("'/nonexistent/theme'")));
+    QVERIFY(ConfigFixture::reset(key("directory")));
     QTRY_COMPARE(changed.count(), 2);
     QCOMPARE(theme.themeDirectory(), builtIn);
 }

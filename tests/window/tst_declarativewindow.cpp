@@ -198,6 +198,8 @@ void tst_DeclarativeWindow::defaultAllowedOrientations_data()
     QTest::newRow("phone, 16 rejected") << 5.0 << "16" << 11 << true;
     QTest::newRow("tablet, 0 rejected") << 10.0 << "0" << 15 << true;
     QTest::newRow("phone, text rejected") << 5.0 << "'all'" << 11 << true;
+    QTest::newRow("phone, boolean rejected") << 5.0 << "true" << 11 << true;
+    QTest::newRow("phone, 2^32 + 1 not cut to 1") << 5.0 << "int64 4294967297" << 11 << true;
 }
 
 void tst_DeclarativeWindow::defaultAllowedOrientations()
