@@ -4,7 +4,6 @@
 
 #include <QCoreApplication>
 #include <QQmlInfo>
-#include <QRegularExpression>
 #include <QTimerEvent>
 
 namespace {
@@ -42,8 +41,7 @@ void AutoFill::componentComplete()
 
 void AutoFill::setKey(const QString &key)
 {
-    static const QRegularExpression notFileCharacter(QStringLiteral("[^\\w\\.]"));
-    const QString sanitised = QString(key).remove(notFileCharacter);
+    const QString sanitised = AutoFillDatabase::sanitisedKey(key);
     if (sanitised == m_key)
         return;
     m_key = sanitised;

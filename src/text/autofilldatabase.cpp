@@ -1,6 +1,7 @@
 #include "autofilldatabase.h"
 #include "pelkanlogging.h"
 
+#include <QDateTime>
 #include <QDir>
 #include <QFile>
 #include <QStandardPaths>
@@ -11,6 +12,29 @@
 namespace {
 // File names are limited to 255 bytes; keep clear of it.
 const int MaximumKeyLength = 200;
+const QLatin1String TemporarySuffix("~");
+const int StaleTemporarySeconds = 60;
+
+bool isKeyCharacter(uint code)
+{
+    if (code == '_' || code == '.')
+        return true;
+    switch (QChar::category(code)) {
+    case QChar::Letter_Uppercase:
+    case QChar::Letter_Lowercase:
+    case QChar::Letter_Titlecase:
+    case QChar::Letter_Modifier:
+    case QChar::Letter_Other:
+    case QChar::Mark_NonSpacing:
+    case QChar::Mark_SpacingCombining:
+    case QChar::Number_DecimalDigit:
+    case QChar::Number_Letter:
+    case QChar::Number_Other:
+        return true;
+    default:
+        return false;
+    }
+}
 } // namespace
 
 AutoFillDatabase *AutoFillDatabase::instance()
@@ -31,6 +55,35 @@ bool AutoFillDatabase::isUsableKey(const QString &key)
             && !key.contains(QLatin1Char('/')) && key.toUtf8().size() <= MaximumKeyLength;
 }
 
+QString AutoFillDatabase::sanitisedKey(const QString &key)
+{
+    QString result;
+    result.reserve(key.size());
+    for (int i = 0; i < key.size(); ++i) {
+        const QChar c = key.at(i);
+        if (c.isHighSurrogate() && i + 1 < key.size() && key.at(i + 1).isLowSurrogate()) {
+            const uint code = QChar::surrogateToUcs4(c, key.at(i + 1));
+            if (isKeyCharacter(code))
+                result.append(c).append(key.at(i + 1));
+            ++i;
+        } else if (!c.isSurrogate() && isKeyCharacter(c.unicode())) {
+            result.append(c);
+        }
+    }
+    return result;
+}
+
+void AutoFillDatabase::removeStaleTemporaries()
+{
+    const QDateTime stale = QDateTime::currentDateTimeUtc().addSecs(-StaleTemporarySeconds);
+    const QFileInfoList leftovers = QDir(m_directory).entryInfoList({ QLatin1String("*") + TemporarySuffix },
+                                                                    QDir::Files | QDir::Hidden | QDir::System);
+    for (const QFileInfo &leftover : leftovers) {
+        if (leftover.lastModified().toUTC() < stale)
+            QFile::remove(leftover.filePath());
+    }
+}
+
 bool AutoFillDatabase::ensureDirectory()
 {
     if (m_directoryReady)
@@ -43,6 +96,7 @@ bool AutoFillDatabase::ensureDirectory()
         return false;
     }
     m_directoryReady = true;
+    removeStaleTemporaries();
     return true;
 }
 
@@ -116,7 +170,7 @@ QStringList AutoFillDatabase::readFile(const QString &path)
 
 bool AutoFillDatabase::writeFile(const QString &path, const QStringList &lines)
 {
-    QTemporaryFile temporary(QFileInfo(path).absoluteFilePath());
+    QTemporaryFile temporary(QFileInfo(path).absoluteFilePath() + QLatin1String(".XXXXXX") + TemporarySuffix);
     temporary.setAutoRemove(false);
     if (!temporary.open())
         return false;

@@ -13,6 +13,10 @@
 // Keys must name a file in the folder: empty, ".", ".." and over-long keys are refused
 // with a warning, and nothing outside the folder is ever read or written. If the folder
 // cannot be made, suggestions still work in memory for the life of the process.
+//
+// Temporary files end in '~', which no key can hold; those left by a process killed while
+// saving are removed when the folder is first used, once they are a minute old (younger
+// ones may belong to another process saving right now).
 class AutoFillDatabase
 {
 public:
@@ -23,6 +27,9 @@ public:
 
     QString directory() const { return m_directory; }
     static bool isUsableKey(const QString &key);
+    // key with every code point removed that is not a letter, mark or digit of any script,
+    // '_' or '.'; unpaired surrogates and control characters go too.
+    static QString sanitisedKey(const QString &key);
 
     QStringList suggestions(const QString &key);
     // Puts the suggestion first (moving it there if present); false when refused.
@@ -42,6 +49,7 @@ private:
     };
     Entry *entry(const QString &key);
     bool ensureDirectory();
+    void removeStaleTemporaries();
 
     QString m_directory;
     bool m_directoryReady = false;

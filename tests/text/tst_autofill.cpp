@@ -25,6 +25,7 @@ private Q_SLOTS:
     void keysThatNameNoFileAreRefused();
     void unusableDirectoryKeepsSuggestionsInMemory();
     void rewriteIsAtomic();
+    void staleTemporariesAreRemoved();
     void objectRefreshesAndSaves();
     void badCallsExplainThemselves();
 };
@@ -37,6 +38,13 @@ void tst_AutoFill::keySanitising_data()
     QTest::newRow("spaces fold together") << "a b" << "ab";
     QTest::newRow("dots and underscores stay") << "mail.to_address" << "mail.to_address";
     QTest::newRow("path escape") << "../../etc/passwd" << "....etcpasswd";
+    QTest::newRow("unpaired surrogate") << QStringLiteral("my key%") + QChar(0xd800) << "mykey";
+    QTest::newRow("NUL") << QString::fromUtf16(u"a\0b", 3) << "ab";
+    QTest::newRow("Finnish letters") << QString::fromUtf8("S\xc3\xa4hk\xc3\xb6posti") << QString::fromUtf8("S\xc3\xa4hk\xc3\xb6posti");
+    QTest::newRow("Cyrillic") << QString::fromUtf8("\xd0\xbf\xd0\xbe\xd1\x87\xd1\x82\xd0\xb0!") << QString::fromUtf8("\xd0\xbf\xd0\xbe\xd1\x87\xd1\x82\xd0\xb0");
+    QTest::newRow("Han") << QString::fromUtf8("\xe9\x9b\xbb \xe9\x83\xb5") << QString::fromUtf8("\xe9\x9b\xbb\xe9\x83\xb5");
+    QTest::newRow("Devanagari with its marks") << QString::fromUtf8("\xe0\xa4\xa8\xe0\xa4\xbe\xe0\xa4\xae") << QString::fromUtf8("\xe0\xa4\xa8\xe0\xa4\xbe\xe0\xa4\xae");
+    QTest::newRow("a letter beyond 16 bits") << QString::fromUtf8("k\xf0\x90\x90\x80/") << QString::fromUtf8("k\xf0\x90\x90\x80");
 }
 
 void tst_AutoFill::keySanitising()
@@ -46,6 +54,13 @@ void tst_AutoFill::keySanitising()
     AutoFill fill;
     fill.setKey(key);
     QCOMPARE(fill.key(), stored);
+    // The key is the file's name, whole.
+    QTemporaryDir dir;
+    AutoFillDatabase database(dir.path());
+    QVERIFY(database.insert(fill.key(), QStringLiteral("remembered")));
+    database.save();
+    QCOMPARE(QDir(dir.path()).entryList(QDir::Files | QDir::Hidden), QStringList({ stored }));
+    QCOMPARE(AutoFillDatabase::readFile(dir.filePath(stored)), QStringList({ "remembered" }));
 }
 
 void tst_AutoFill::insertSimplifiesAndOrders()
@@ -184,6 +199,25 @@ void tst_AutoFill::rewriteIsAtomic()
     QCOMPARE(torn.load(), 0);
     // No temporary files are left behind.
     QCOMPARE(QDir(dir.path()).entryList(QDir::Files), QStringList({ "k" }));
+}
+
+// What a process killed while saving leaves behind goes when the folder is next used;
+// what another process is writing right now stays.
+void tst_AutoFill::staleTemporariesAreRemoved()
+{
+    QTemporaryDir dir;
+    QVERIFY(AutoFillDatabase::writeFile(dir.filePath(QStringLiteral("email")), { QStringLiteral("a@example.org") }));
+    auto leave = [&dir](const QString &name, int age) {
+        QFile file(dir.filePath(name));
+        return file.open(QIODevice::WriteOnly) && file.write("half") == 4 && file.flush()
+                && file.setFileTime(QDateTime::currentDateTime().addSecs(-age), QFileDevice::FileModificationTime);
+    };
+    QVERIFY(leave(QStringLiteral("email.FvSQMO~"), 3600));
+    QVERIFY(leave(QStringLiteral("phone.AbCdEf~"), 120));
+    QVERIFY(leave(QStringLiteral("email.Xy12Zq~"), 0));
+    AutoFillDatabase database(dir.path());
+    QCOMPARE(database.suggestions(QStringLiteral("email")), QStringList({ "a@example.org" }));
+    QCOMPARE(QDir(dir.path()).entryList(QDir::Files), QStringList({ "email", "email.Xy12Zq~" }));
 }
 
 void tst_AutoFill::objectRefreshesAndSaves()
