@@ -7,6 +7,7 @@
 #include <QCoreApplication>
 #include <QDBusConnection>
 #include <QDBusConnectionInterface>
+#include <QDBusReply>
 #include <QQuickItem>
 #include <QQuickWindow>
 
@@ -16,6 +17,10 @@ const QString PayloadProperty = QStringLiteral("_APP_COVER_ACTION");
 const QString ServicePrefix = QStringLiteral("org.quorvaneos.coveraction.pid");
 
 int s_listCount = 0;
+// Every list of the process, for finding the one a window shows.
+QVector<DeclarativeCoverActionList *> s_lists;
+// Counts enablings: the list enabled most recently is the one its window shows.
+quint64 s_enableCount = 0;
 
 } // namespace
 
@@ -29,11 +34,28 @@ DeclarativeCoverActionList::DeclarativeCoverActionList(QObject *parent)
     m_enableTimer.setSingleShot(true);
     m_enableTimer.setInterval(5);
     connect(&m_enableTimer, &QTimer::timeout, this, &DeclarativeCoverActionList::enableActiveCovers);
+    m_enabledOrder = ++s_enableCount;
+    s_lists.append(this);
 }
 
 DeclarativeCoverActionList::~DeclarativeCoverActionList()
 {
-    disableActiveCovers();
+    s_lists.removeOne(this);
+    leaveWindow(m_window);
+    unregisterFromBus();
+}
+
+DeclarativeCoverActionList *DeclarativeCoverActionList::shownList(QWindow *window)
+{
+    DeclarativeCoverActionList *shown = nullptr;
+    if (!window)
+        return shown;
+    for (DeclarativeCoverActionList *list : qAsConst(s_lists)) {
+        if (list->m_window == window && list->m_enabled && !list->m_actions.isEmpty()
+                && (!shown || list->m_enabledOrder > shown->m_enabledOrder))
+            shown = list;
+    }
+    return shown;
 }
 
 // Actions -------------------------------------------------------------------------------
@@ -89,8 +111,8 @@ void DeclarativeCoverActionList::setEnabled(bool enabled)
     if (enabled == m_enabled)
         return;
     m_enabled = enabled;
-    if (!enabled)
-        disableActiveCovers();
+    if (enabled)
+        m_enabledOrder = ++s_enableCount;
     m_enableTimer.start();
     Q_EMIT enabledChanged();
 }
@@ -142,14 +164,19 @@ void DeclarativeCoverActionList::attachToWindow(QWindow *window)
 {
     if (window == m_window)
         return;
-    disableActiveCovers();
     if (m_window)
         disconnect(m_window, nullptr, this, nullptr);
+    QWindow *previous = m_window;
     m_window = window;
     if (window) {
         // The native id arrives with the first showing.
         connect(window, &QWindow::visibleChanged, this, &DeclarativeCoverActionList::coversUpdated);
+        connect(window, &QObject::destroyed, this, [this] {
+            m_window = nullptr;
+            Q_EMIT windowChanged(nullptr);
+        });
     }
+    leaveWindow(previous);
     m_enableTimer.start();
     Q_EMIT windowChanged(window);
 }
@@ -190,18 +217,39 @@ void DeclarativeCoverActionList::registerOnBus()
         return;
     }
     if (!bus.registerObject(m_objectPath, this, QDBusConnection::ExportScriptableSlots)) {
-        qCWarning(lcPelkanCoverLog) << QStringLiteral("Failed to register object: %1, error %2")
-                                               .arg(m_objectPath, bus.lastError().message());
+        qCWarning(lcPelkanCoverLog).noquote() << QStringLiteral("Failed to register object: %1, error %2")
+                                                         .arg(m_objectPath, describe(bus.lastError()));
         return;
     }
-    if (!bus.registerService(m_serviceName)) {
-        qCWarning(lcPelkanCoverLog) << QStringLiteral("Failed to register service: %1, error %2")
-                                               .arg(m_serviceName, bus.lastError().message());
+    const QDBusReply<QDBusConnectionInterface::RegisterServiceReply> reply = bus.interface()->registerService(
+            m_serviceName, QDBusConnectionInterface::DontQueueService, QDBusConnectionInterface::DontAllowReplacement);
+    if (!reply.isValid() || reply.value() != QDBusConnectionInterface::ServiceRegistered) {
+        const QString error = reply.isValid() ? QStringLiteral("the name is owned by another connection")
+                                              : describe(reply.error());
+        qCWarning(lcPelkanCoverLog).noquote() << QStringLiteral("Failed to register service: %1, error %2")
+                                                         .arg(m_serviceName, error);
         bus.unregisterObject(m_objectPath);
         return;
     }
     m_registered = true;
-    qCDebug(lcPelkanCoverLog) << QStringLiteral("dbus ready %1").arg(m_serviceName);
+    qCDebug(lcPelkanCoverLog).noquote() << QStringLiteral("dbus ready %1").arg(m_serviceName);
+}
+
+void DeclarativeCoverActionList::unregisterFromBus()
+{
+    if (!m_registered)
+        return;
+    QDBusConnection bus = QDBusConnection::sessionBus();
+    bus.unregisterObject(m_objectPath);
+    bus.interface()->unregisterService(m_serviceName);
+    m_registered = false;
+}
+
+QString DeclarativeCoverActionList::describe(const QDBusError &error)
+{
+    if (!error.isValid())
+        return QStringLiteral("unknown error");
+    return error.name() + QLatin1String(": ") + error.message();
 }
 
 void DeclarativeCoverActionList::trigger(int id)
@@ -214,7 +262,7 @@ void DeclarativeCoverActionList::trigger(int id)
         }
     }
     if (id < 0 || id >= m_actions.size()) {
-        qCWarning(lcPelkanCoverLog) << "CoverActionList: no action at index" << id;
+        qCWarning(lcPelkanCoverLog).noquote() << QStringLiteral("CoverActionList: no action at index %1").arg(id);
         return;
     }
     Q_EMIT m_actions.at(id)->triggered();
@@ -244,7 +292,7 @@ QString DeclarativeCoverActionList::removeEntries(const QString &payload, const 
     while (i < lines.size()) {
         if (lines.at(i).startsWith(ServicePrefix)) {
             if (i + 3 >= lines.size() || lines.at(i + 1) != QLatin1String("trigger")) {
-                qCDebug(lcPelkanCoverLog) << QStringLiteral("Bad action: %1").arg(lines.at(i));
+                qCDebug(lcPelkanCoverLog).noquote() << QStringLiteral("Bad action: %1").arg(lines.at(i));
                 ++i;
                 continue;
             }
@@ -257,7 +305,7 @@ QString DeclarativeCoverActionList::removeEntries(const QString &payload, const 
                 kept << lines.at(i);
             ++i;
         } else {
-            qCDebug(lcPelkanCoverLog) << QStringLiteral("Bad action: %1").arg(lines.at(i));
+            qCDebug(lcPelkanCoverLog).noquote() << QStringLiteral("Bad action: %1").arg(lines.at(i));
             ++i;
         }
     }
@@ -266,16 +314,40 @@ QString DeclarativeCoverActionList::removeEntries(const QString &payload, const 
 
 void DeclarativeCoverActionList::enableActiveCovers()
 {
-    const quint64 id = windowId();
-    qCDebug(lcPelkanCoverLog) << QStringLiteral("enableActiveCovers, process: %1, winId: %2, action count: %3, enabled: %4")
-                                         .arg(QCoreApplication::applicationPid()).arg(id).arg(m_actions.size()).arg(m_enabled ? 1 : 0);
+    qCDebug(lcPelkanCoverLog).noquote()
+            << QStringLiteral("enableActiveCovers, process: %1, winId: %2, action count: %3, enabled: %4")
+                       .arg(QCoreApplication::applicationPid()).arg(windowId()).arg(m_actions.size()).arg(m_enabled ? 1 : 0);
+    // The window shows one list: this one, or one enabled later, or, when this one has
+    // nothing to offer, the one before it; with none left its entries simply go.
+    if (DeclarativeCoverActionList *shown = shownList(m_window))
+        shown->publish();
+    else
+        disableActiveCovers();
+}
+
+void DeclarativeCoverActionList::leaveWindow(QWindow *window)
+{
+    if (!window)
+        return;
+    if (DeclarativeCoverActionList *next = shownList(window)) {
+        next->publish(); // replaces this list's entries as a whole
+    } else {
+        QPointer<QWindow> current = m_window;
+        m_window = window;
+        disableActiveCovers();
+        m_window = current;
+    }
+}
+
+void DeclarativeCoverActionList::publish()
+{
     QList<QUrl> icons;
     for (DeclarativeCoverAction *action : qAsConst(m_actions))
         icons << action->iconSource();
-    const QString payload = buildPayload(id, m_enabled, m_serviceName, icons, m_iconBackground);
+    const QString payload = buildPayload(windowId(), m_enabled, m_serviceName, icons, m_iconBackground);
     if (payload.isEmpty() || !m_wayland)
         return;
-    qCDebug(lcPelkanCoverLog) << QStringLiteral("CoverActionList::setWindowProperty: %1").arg(payload);
+    qCDebug(lcPelkanCoverLog).noquote() << QStringLiteral("CoverActionList::setWindowProperty: %1").arg(payload);
     WindowPropertyPublisher::setProperty(m_window, PayloadProperty, payload);
 }
 
@@ -283,12 +355,15 @@ void DeclarativeCoverActionList::disableActiveCovers()
 {
     if (!m_window || !m_wayland)
         return;
-    qCDebug(lcPelkanCoverLog) << QStringLiteral("disableActiveCovers, process: %1, winId: %2, action count: %3, enabled: %4")
-                                         .arg(QCoreApplication::applicationPid()).arg(windowId()).arg(m_actions.size()).arg(m_enabled ? 1 : 0);
+    qCDebug(lcPelkanCoverLog).noquote()
+            << QStringLiteral("disableActiveCovers, process: %1, winId: %2, action count: %3, enabled: %4")
+                       .arg(QCoreApplication::applicationPid()).arg(windowId()).arg(m_actions.size()).arg(m_enabled ? 1 : 0);
     const QVariant current = WindowPropertyPublisher::property(m_window, PayloadProperty);
     if (!current.isValid()) {
         qCDebug(lcPelkanCoverLog) << "property does not yet exist";
         return;
     }
-    WindowPropertyPublisher::setProperty(m_window, PayloadProperty, removeEntries(current.toString(), m_serviceName));
+    const QString left = removeEntries(current.toString(), m_serviceName);
+    if (left != current.toString())
+        WindowPropertyPublisher::setProperty(m_window, PayloadProperty, left);
 }

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <QDBusContext>
+#include <QDBusError>
 #include <QObject>
 #include <QPointer>
 #include <QQmlListProperty>
@@ -30,8 +31,12 @@ class DeclarativeCoverAction;
 //   the bus must have connected in the group "privileged" or as root and still run so
 //   (see CoverActionCaller); others get an access-denied error. Direct calls from the
 //   application itself are not checked.
-// - Disabling the list, moving it to another window or destroying it takes its entries
-//   (those naming its bus name) out of the window's payload and leaves other lists' alone.
+// - Disabling the list, emptying it, moving it to another window or destroying it takes
+//   its entries (those naming its bus name) out of the window's payload and leaves other
+//   lists' alone. A window shows one list at a time: of its enabled lists with actions,
+//   the one enabled most recently; when that one goes, the next one shows itself.
+// - Destroying the list unregisters its object and gives its bus name back.
+// - When the window is destroyed, `window` reads null and windowChanged() is emitted.
 class DeclarativeCoverActionList : public QObject, public QQmlParserStatus, protected QDBusContext
 {
     Q_OBJECT
@@ -85,7 +90,15 @@ Q_SIGNALS:
     void windowChanged(QWindow *window);
 
 private:
+    // The list a window shows: of its enabled lists with actions, the one enabled last.
+    static DeclarativeCoverActionList *shownList(QWindow *window);
+    static QString describe(const QDBusError &error);
     void registerOnBus();
+    void unregisterFromBus();
+    // Sets this list's payload on its window, whole.
+    void publish();
+    // Hands window over to its next list, or takes this list's entries off it.
+    void leaveWindow(QWindow *window);
     void disableActiveCovers();
     void attachToWindow(QWindow *window);
     QWindow *automaticWindow() const;
@@ -100,5 +113,6 @@ private:
     QString m_serviceName;
     QString m_objectPath;
     bool m_registered = false;
+    quint64 m_enabledOrder = 0; // when it was last enabled, counted over all lists
     QTimer m_enableTimer;
 };

@@ -1,6 +1,7 @@
 #include "homescreensession.h"
 
 #include <QJsonArray>
+#include <QJsonDocument>
 #include <QtTest>
 
 #include <cerrno>
@@ -22,6 +23,8 @@ private Q_SLOTS:
     void coverWindowPairsWithApplication_data();
     void coverWindowPairsWithApplication();
     void coverActionsEndToEnd();
+    void twoActionListsOnOneWindow_data();
+    void twoActionListsOnOneWindow();
     void coverStatusFromHomeScreen();
     void backKey_data();
     void backKey();
@@ -180,6 +183,50 @@ void tst_HomeScreen::coverActionsEndToEnd()
     const QJsonObject emptied = session.waitForEvent(QStringLiteral("coverActions"));
     QCOMPARE(emptied.value(QLatin1String("actions")).toArray().size(), 0);
     QVERIFY(!emptied.contains(QLatin1String("error")));
+}
+
+void tst_HomeScreen::twoActionListsOnOneWindow_data()
+{
+    QTest::addColumn<int>("press");
+    QTest::addColumn<bool>("secondStaysOnBus");
+    QTest::newRow("second list emptied") << 0 << true;
+    QTest::newRow("second list destroyed") << 1 << false;
+}
+
+// The window shows the list enabled last; when it empties or goes, the first one's
+// buttons come back, and a destroyed list's bus name goes with it.
+void tst_HomeScreen::twoActionListsOnOneWindow()
+{
+    QFETCH(int, press);
+    QFETCH(bool, secondStaysOnBus);
+    if (!privilegedHere())
+        QSKIP("the home screen must be privileged to press cover actions");
+    HomeScreenSession session;
+    QVERIFY(run(session, { QStringLiteral("lists=2") }));
+    auto shownService = [](const QJsonObject &published) {
+        return published.value(QLatin1String("actions")).toArray().at(0).toObject().value(QLatin1String("service")).toString();
+    };
+    auto showing = [&shownService](const char *id) {
+        return [&shownService, id](const QJsonObject &r) {
+            return r.value(QLatin1String("event")) == QLatin1String("coverActions") && shownService(r).endsWith(QLatin1String(id));
+        };
+    };
+    const QString second = shownService(session.waitFor(showing(".id2")));
+    QVERIFY(!second.isEmpty());
+
+    session.send(QStringLiteral("trigger %1").arg(press));
+    const QJsonObject reply = session.waitForEvent(QStringLiteral("triggered"));
+    QCOMPARE(reply.value(QLatin1String("service")).toString(), second);
+    QCOMPARE(reply.value(QLatin1String("error")).toString(), QString());
+    // Straight from one list's buttons to the other's, with no empty set between.
+    const QJsonObject shown = session.waitForEvent(QStringLiteral("coverActions"));
+    QVERIFY2(shownService(shown).endsWith(QLatin1String(".id1")), qPrintable(QJsonDocument(shown).toJson()));
+    QCOMPARE(shown.value(QLatin1String("actions")).toArray().size(), 2);
+
+    session.send(QStringLiteral("names"));
+    const QJsonArray names = session.waitForEvent(QStringLiteral("names")).value(QLatin1String("names")).toArray();
+    QCOMPARE(names.contains(second), secondStaysOnBus);
+    QCOMPARE(names.size(), secondStaysOnBus ? 2 : 1);
 }
 
 void tst_HomeScreen::coverStatusFromHomeScreen()

@@ -33,6 +33,7 @@ static const char BusConfig[] =
         "    <allow eavesdrop=\"true\"/>\n"
         "    <allow own=\"*\"/>\n"
         "  </policy>\n"
+        "  <limit name=\"max_names_per_connection\">40</limit>\n"
         "</busconfig>\n";
 
 class tst_DeclarativeCoverActionList : public QObject
@@ -42,7 +43,7 @@ class tst_DeclarativeCoverActionList : public QObject
 private Q_SLOTS:
     void initTestCase();
     void cleanupTestCase();
-    void cleanup() { WindowPropertyPublisher::setSinkForTesting({}); }
+    void cleanup();
 
     void listsGetNumberedNamesOnTheBus();
     void triggerFromPrivilegedCaller_data();
@@ -56,6 +57,11 @@ private Q_SLOTS:
     void removeEntries_data();
     void removeEntries();
     void changesArePublishedTogether();
+    void destroyedListLeavesTheBus();
+    void windowShowsTheLatestEnabledList_data();
+    void windowShowsTheLatestEnabledList();
+    void destroyedWindowIsAnnounced();
+    void logTextsAsGiven();
 
 private:
     DeclarativeCoverActionList *makeList(int actions);
@@ -88,9 +94,15 @@ void tst_DeclarativeCoverActionList::initTestCase()
     QVERIFY(QDBusConnection::sessionBus().isConnected());
 }
 
+void tst_DeclarativeCoverActionList::cleanup()
+{
+    WindowPropertyPublisher::setSinkForTesting({});
+    qDeleteAll(m_made);
+    m_made.clear();
+}
+
 void tst_DeclarativeCoverActionList::cleanupTestCase()
 {
-    qDeleteAll(m_made);
     m_bus.terminate();
     m_bus.waitForFinished();
 }
@@ -358,6 +370,133 @@ void tst_DeclarativeCoverActionList::changesArePublishedTogether()
     list->setEnabled(false);
     QTRY_COMPARE(published.size(), 2);
     QCOMPARE(published.last(), QString());
+}
+
+void tst_DeclarativeCoverActionList::destroyedListLeavesTheBus()
+{
+    DeclarativeCoverActionList *kept = makeList(1);
+    DeclarativeCoverActionList *gone = makeList(1);
+    const QString name = gone->serviceName();
+    QDBusConnectionInterface *bus = QDBusConnection::sessionBus().interface();
+    QVERIFY(bus->registeredServiceNames().value().contains(name));
+    m_made.removeOne(gone);
+    delete gone;
+    QVERIFY(!bus->registeredServiceNames().value().contains(name));
+    QVERIFY(bus->isServiceRegistered(kept->serviceName()));
+
+    QDBusConnection caller = QDBusConnection::connectToBus(m_address, QStringLiteral("late caller"));
+    QDBusMessage call = QDBusMessage::createMethodCall(name, QLatin1Char('/') + QString(name).replace(QLatin1Char('.'), QLatin1Char('/')),
+                                                      QStringLiteral("org.quorvaneos.pelkan.coveraction"), QStringLiteral("trigger"));
+    call << 0;
+    const QDBusMessage reply = caller.call(call);
+    QCOMPARE(reply.errorName(), QStringLiteral("org.freedesktop.DBus.Error.ServiceUnknown"));
+    QDBusConnection::disconnectFromBus(QStringLiteral("late caller"));
+}
+
+void tst_DeclarativeCoverActionList::windowShowsTheLatestEnabledList_data()
+{
+    QTest::addColumn<QString>("change");
+    QTest::addColumn<int>("shown"); // which list's entries the window ends with, -1 for none
+    QTest::newRow("both enabled: the later one") << "" << 1;
+    QTest::newRow("later one disabled") << "disable 1" << 0;
+    QTest::newRow("earlier one disabled") << "disable 0" << 1;
+    QTest::newRow("both disabled") << "disable 0,disable 1" << -1;
+    QTest::newRow("later one emptied") << "empty 1" << 0;
+    QTest::newRow("later one's actions destroyed") << "destroy actions 1" << 0;
+    QTest::newRow("later one destroyed") << "destroy 1" << 0;
+    QTest::newRow("earlier one re-enabled") << "disable 0,enable 0" << 0;
+    QTest::newRow("earlier one's icon changes") << "icon 0" << 1;
+    QTest::newRow("all emptied") << "empty 0,empty 1" << -1;
+}
+
+void tst_DeclarativeCoverActionList::windowShowsTheLatestEnabledList()
+{
+    QFETCH(QString, change);
+    QFETCH(int, shown);
+    QString published;
+    WindowPropertyPublisher::setSinkForTesting([&published](QWindow *, const QString &name, const QVariant &value) {
+        if (name == QLatin1String("_APP_COVER_ACTION"))
+            published = value.toString();
+    }, QStringLiteral("wayland"));
+    QQuickWindow window;
+    window.show();
+    QVERIFY(QTest::qWaitForWindowExposed(&window));
+    QVector<DeclarativeCoverActionList *> lists;
+    for (int i = 0; i < 2; ++i) {
+        lists << makeList(2);
+        lists.last()->setWindow(&window);
+    }
+    QTRY_VERIFY(published.startsWith(lists.at(1)->serviceName()));
+
+    for (const QString &step : change.split(QLatin1Char(','), Qt::SkipEmptyParts)) {
+        DeclarativeCoverActionList *list = lists.at(step.right(1).toInt());
+        if (step.startsWith(QLatin1String("disable")))
+            list->setEnabled(false);
+        else if (step.startsWith(QLatin1String("enable")))
+            list->setEnabled(true);
+        else if (step.startsWith(QLatin1String("empty")))
+            list->clearActions();
+        else if (step.startsWith(QLatin1String("destroy actions")))
+            qDeleteAll(QVector<DeclarativeCoverAction *>(list->actionList()));
+        else if (step.startsWith(QLatin1String("icon")))
+            list->actionList().first()->setIconSource(QUrl(QStringLiteral("image://theme/changed")));
+        else if (step.startsWith(QLatin1String("destroy"))) {
+            m_made.removeOne(list);
+            delete list;
+        }
+        QTest::qWait(20);
+    }
+    QTest::qWait(30);
+    if (shown < 0) {
+        QCOMPARE(published, QString());
+    } else {
+        const QStringList lines = published.split(QLatin1Char('\n'));
+        QCOMPARE(lines.size(), 9);
+        QCOMPARE(lines.at(0), lists.at(shown)->serviceName());
+        QCOMPARE(lines.at(4), lists.at(shown)->serviceName());
+    }
+}
+
+void tst_DeclarativeCoverActionList::destroyedWindowIsAnnounced()
+{
+    DeclarativeCoverActionList *list = makeList(1);
+    auto window = new QQuickWindow;
+    list->setWindow(window);
+    QSignalSpy changed(list, &DeclarativeCoverActionList::windowChanged);
+    delete window;
+    QCOMPARE(changed.count(), 1);
+    QCOMPARE(list->window(), nullptr);
+}
+
+namespace {
+QStringList s_messages;
+void collectMessages(QtMsgType, const QMessageLogContext &, const QString &text)
+{
+    s_messages << text;
+}
+} // namespace
+
+// The log's texts stand exactly as given: no quotes around them, and a refused bus name
+// says what the bus said.
+void tst_DeclarativeCoverActionList::logTextsAsGiven()
+{
+    QLoggingCategory::setFilterRules(QStringLiteral("org.quorvaneos.pelkan.cover.debug=true"));
+    s_messages.clear();
+    const QtMessageHandler previous = qInstallMessageHandler(collectMessages);
+    // Each connection may own 40 names here: the 41st list is refused by the bus.
+    DeclarativeCoverActionList *first = makeList(1);
+    for (int i = 0; i < 40; ++i)
+        makeList(1);
+    qInstallMessageHandler(previous);
+    QLoggingCategory::setFilterRules(QString());
+
+    QVERIFY2(s_messages.contains(QStringLiteral("dbus ready ") + first->serviceName()), qPrintable(s_messages.join('\n')));
+    const QStringList refused = s_messages.filter(QStringLiteral("Failed to register service"));
+    QVERIFY2(!refused.isEmpty(), qPrintable(s_messages.join('\n')));
+    QVERIFY2(refused.first().contains(QRegularExpression(QStringLiteral(
+                     "^Failed to register service: org\\.quorvaneos\\.coveraction\\.pid\\d+\\.id\\d+, "
+                     "error org\\.freedesktop\\.DBus\\.Error\\.LimitsExceeded: \\S"))),
+             qPrintable(refused.first()));
 }
 
 QTEST_MAIN(tst_DeclarativeCoverActionList)

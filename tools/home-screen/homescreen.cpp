@@ -5,11 +5,13 @@
 
 #include <QCoreApplication>
 #include <QDBusConnection>
+#include <QDBusConnectionInterface>
 #include <QDBusMessage>
 #include <QDBusPendingCallWatcher>
 #include <QDBusPendingReply>
 #include <QJsonArray>
 #include <QRectF>
+#include <QRegularExpression>
 #include <QWaylandOutput>
 #include <QWaylandSeat>
 #include <QWaylandSurface>
@@ -260,6 +262,8 @@ void HomeScreen::handleCommand(const QString &line)
         triggerCoverAction(argument);
     } else if (command == QLatin1String("coverstatus") && ok) {
         sendCoverStatus(argument);
+    } else if (command == QLatin1String("names")) {
+        recordCoverActionNames();
     } else if (command == QLatin1String("quit")) {
         m_client.stop();
         Q_EMIT quitRequested();
@@ -318,6 +322,14 @@ void HomeScreen::triggerCoverAction(int index)
                                                          { QStringLiteral("error"), reply.isError() ? reply.error().name() : QString() },
                                                          { QStringLiteral("message"), reply.isError() ? reply.error().message() : QString() } });
     });
+}
+
+void HomeScreen::recordCoverActionNames()
+{
+    QStringList names = QDBusConnection::sessionBus().interface()->registeredServiceNames().value();
+    names = names.filter(QRegularExpression(QStringLiteral("^org\\.quorvaneos\\.coveraction\\.")));
+    names.sort();
+    m_recorder.record(QStringLiteral("names"), { { QStringLiteral("names"), QJsonArray::fromStringList(names) } });
 }
 
 void HomeScreen::sendCoverStatus(int status)

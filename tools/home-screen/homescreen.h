@@ -34,7 +34,8 @@ public:
     // Runs an application as a client; the home screen ends with it.
     void launch(const QStringList &command);
 
-    // "focus", "key back", "trigger <index>", "coverstatus <status>", "quit".
+    // "focus", "key back", "trigger <index>", "coverstatus <status>", "names" (the cover
+    // action names on the bus), "quit".
     void handleCommand(const QString &line);
 
 Q_SIGNALS:
@@ -53,6 +54,7 @@ private:
     void sendBackKey();
     void triggerCoverAction(int index);
     void sendCoverStatus(int status);
+    void recordCoverActionNames();
 
     int numberOf(QWaylandSurface *surface) const;
     ExtendedSurface *applicationSurface() const;

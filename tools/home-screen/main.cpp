@@ -7,8 +7,8 @@
 // when it ends. Other clients connect with WAYLAND_DISPLAY=NAME, QT_QPA_PLATFORM=wayland
 // and QT_WAYLAND_SHELL_INTEGRATION=wl-shell. Records are JSON lines on standard output;
 // commands are lines on standard input: "focus" (the newest application window gets the
-// keyboard), "key back", "trigger <index>", "coverstatus <status>", "quit". End of input
-// also quits.
+// keyboard), "key back", "trigger <index>", "coverstatus <status>", "names" (the cover
+// action names on the bus), "quit". End of input also quits.
 
 #include "homescreen.h"
 

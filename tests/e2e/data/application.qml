@@ -10,6 +10,9 @@ Window {
     property bool category: true
     property int depth: 2
     property int backgroundHeight: 0
+    // With 2, a second action list on the same window, enabled after the first: its
+    // action 0 empties it, its action 1 destroys it.
+    property int lists: 1
 
     width: 270
     height: 480
@@ -64,6 +67,29 @@ Window {
                 CoverAction {
                     iconSource: "image://theme/icon-cover-next"
                     onTriggered: console.log("e2e: action 1")
+                }
+            }
+
+            Loader {
+                id: second
+                active: root.lists > 1
+                sourceComponent: CoverActionList {
+                    id: extras
+                    window: root
+                    CoverAction {
+                        iconSource: "image://theme/icon-cover-refresh"
+                        onTriggered: {
+                            console.log("e2e: emptying the second list")
+                            extras.actions = []
+                        }
+                    }
+                    CoverAction {
+                        iconSource: "image://theme/icon-cover-cancel"
+                        onTriggered: {
+                            console.log("e2e: destroying the second list")
+                            second.active = false
+                        }
+                    }
                 }
             }
         }
