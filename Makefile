@@ -1,14 +1,26 @@
-# The two entry points of the README. Everything else is plain CMake.
+# The two entry points of the README, and the hardened run CI adds. Everything else is
+# plain CMake.
 BUILD ?= build
+SANITIZE_BUILD ?= build-sanitize
+FUZZ_SECONDS ?= 20
 JOBS ?= $(shell nproc)
 
-.PHONY: demo check deps build
+.PHONY: demo check check-sanitized deps build
 
 demo: build
 	scripts/run-demo $(BUILD)
 
 check: build
 	scripts/run-tests $(BUILD)
+
+# Every test again under AddressSanitizer and UndefinedBehaviorSanitizer, then each fuzz
+# target for FUZZ_SECONDS; built with clang so that the fuzz targets use libFuzzer.
+check-sanitized: deps
+	CC=clang CXX=clang++ cmake -S . -B $(SANITIZE_BUILD) -DCMAKE_BUILD_TYPE=RelWithDebInfo \
+		-DPELKAN_SANITIZE=address,undefined -DPELKAN_BUILD_FUZZ=ON -DPELKAN_BUILD_DEMO=OFF
+	cmake --build $(SANITIZE_BUILD) -j $(JOBS)
+	scripts/run-tests $(SANITIZE_BUILD)
+	scripts/run-fuzz $(SANITIZE_BUILD) $(FUZZ_SECONDS)
 
 build: deps
 	cmake -S . -B $(BUILD) -DCMAKE_BUILD_TYPE=RelWithDebInfo

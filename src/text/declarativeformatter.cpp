@@ -259,8 +259,13 @@ QString DeclarativeFormatter::datePattern(const QDate &date, const char *id, boo
 
 QString DeclarativeFormatter::elapsed(const QDateTime &dateTime, const QDate &today, bool shortForm) const
 {
-    // As dateTime.secsTo(now), without building a local date-time for now.
-    const qint64 seconds = (FormatterSeams::currentMSecsSinceEpoch() - dateTime.toMSecsSinceEpoch()) / 1000;
+    // As dateTime.secsTo(now), without building a local date-time for now. The earliest
+    // and latest dates Qt knows lie further apart than 64 bits of milliseconds.
+    const qint64 then = dateTime.toMSecsSinceEpoch();
+    qint64 milliseconds;
+    if (__builtin_sub_overflow(FormatterSeams::currentMSecsSinceEpoch(), then, &milliseconds))
+        milliseconds = then < 0 ? std::numeric_limits<qint64>::max() : std::numeric_limits<qint64>::min();
+    const qint64 seconds = milliseconds / 1000;
     const qint64 minutes = seconds / 60;
     const bool future = minutes < 0;
     const qint64 m = qAbs(minutes);

@@ -19,6 +19,7 @@ class tst_ImageLimits : public QObject
 
 private Q_SLOTS:
     void initTestCase();
+    void cleanupTestCase() { qDeleteAll(m_providers); }
     void hostileFiles_data();
     void hostileFiles();
 

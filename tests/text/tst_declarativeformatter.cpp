@@ -115,6 +115,8 @@ void tst_DeclarativeFormatter::elapsed_data()
     QTest::newRow("short, ahead") << Now << Now.addDays(3) << S << "in 3 d";
     QTest::newRow("179 million years ago") << Now << QDateTime(QDate(-179000000, 1, 1), QTime(12, 0)) << L
                                            << "2147483647 months ago";
+    QTest::newRow("the earliest date there is") << Now << QDateTime::fromMSecsSinceEpoch(-9223372034901316091LL, Qt::UTC) << L
+                                                << "2147483647 months ago";
     QTest::newRow("179 million years ahead") << Now << QDateTime(QDate(179000000, 1, 1), QTime(12, 0)) << L
                                              << "in 2147483647 months";
 }
