@@ -56,9 +56,7 @@ void DeclarativeCover::setTransparent(bool transparent)
     if (transparent == m_transparent)
         return;
     m_transparent = transparent;
-    Q_EMIT transparentChanged();
-    if (auto coverWindow = qobject_cast<DeclarativeCoverWindow *>(window()))
-        coverWindow->publishWindowProperties();
+    Q_EMIT transparentChanged(); // the cover window publishes it
 }
 
 void DeclarativeCover::requestResize(float w, float h)

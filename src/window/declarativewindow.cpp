@@ -212,6 +212,17 @@ void DeclarativeWindow::setScreenOrientation(Qt::ScreenOrientation orientation)
 
 void DeclarativeWindow::setDeviceOrientation(Orientation orientation)
 {
+    // A device faces one way at a time.
+    switch (orientation) {
+    case DeclarativeOrientation::Portrait:
+    case DeclarativeOrientation::Landscape:
+    case DeclarativeOrientation::PortraitInverted:
+    case DeclarativeOrientation::LandscapeInverted:
+        break;
+    default:
+        qCWarning(lcPelkanCoreLog, "Invalid deviceOrientation value: %x", uint(orientation));
+        return;
+    }
     if (orientation == m_deviceOrientation)
         return;
     m_deviceOrientation = orientation;
@@ -505,9 +516,9 @@ void DeclarativeWindow::enterWindow(QQuickWindow *window)
         return;
     }
 
+    if (m_backgroundColor.isValid())
+        window->setColor(m_backgroundColor);
     if (WindowPropertyPublisher::isWayland()) {
-        if (m_backgroundColor.isValid())
-            window->setColor(m_backgroundColor);
         window->setPersistentOpenGLContext(m_persistentOpenGLContext);
         window->setPersistentSceneGraph(m_persistentSceneGraph);
         publishWindowProperties();

@@ -3,6 +3,7 @@
 #include "declarativecoverwindow.h"
 #include "declarativewindow.h"
 #include "theme.h"
+#include "windowpropertypublisher.h"
 
 #include <QDBusConnection>
 #include <QDBusMessage>
@@ -24,6 +25,7 @@ private Q_SLOTS:
     void actionAreaFollowsHeight();
     void coverWindowWithoutAlphaIsBlack();
     void coverWindowFollowsApplicationWindow();
+    void transparencyPublishedOnce();
 
 private:
     static void sendStatus(int status)
@@ -163,6 +165,28 @@ void tst_DeclarativeCover::coverWindowFollowsApplicationWindow()
     main.hide();
     QTRY_VERIFY(coverWindow.isVisible());
     applicationWindow->_setCover(nullptr);
+}
+
+void tst_DeclarativeCover::transparencyPublishedOnce()
+{
+    QVector<QVariant> published;
+    WindowPropertyPublisher::setSinkForTesting([&published](QWindow *, const QString &name, const QVariant &value) {
+        if (name == QLatin1String("TRANSPARENT"))
+            published.append(value);
+    }, QStringLiteral("wayland"));
+    QQuickWindow::setDefaultAlphaBuffer(true);
+    DeclarativeCoverWindow coverWindow;
+    QQuickWindow::setDefaultAlphaBuffer(false);
+    auto cover = new DeclarativeCover(coverWindow.contentItem());
+    coverWindow.setCover(cover);
+    coverWindow.show();
+    QVERIFY(QTest::qWaitForWindowExposed(&coverWindow));
+    published.clear();
+    cover->setTransparent(true);
+    cover->setTransparent(true);
+    cover->setTransparent(false);
+    WindowPropertyPublisher::setSinkForTesting({});
+    QCOMPARE(published, QVector<QVariant>({ true, false }));
 }
 
 QTEST_MAIN(tst_DeclarativeCover)

@@ -49,7 +49,8 @@ private Q_SLOTS:
     void selectOrientation_data();
     void selectOrientation();
     void orientationFollowsDeviceAndAllowed();
-    void zeroAllowedOrientationsIsRefused();
+    void invalidOrientationsAreRefused_data();
+    void invalidOrientationsAreRefused();
     void pageOrientationFollowsUntilSet();
     void defaultAllowedOrientations_data();
     void defaultAllowedOrientations();
@@ -58,7 +59,7 @@ private Q_SLOTS:
     void observersSeeTouchEvents();
     void observersSeeGrabLoss();
     void leavingTheWindowWarnsOnlyForATree();
-    void noPropertiesOffWayland();
+    void offWaylandOnlyTheColour();
     void nothingWithoutANativeHandle();
     void coverAttachAndDestroy();
     void queuedDeletionWaitsForAFrame();
@@ -155,16 +156,33 @@ void tst_DeclarativeWindow::orientationFollowsDeviceAndAllowed()
     QCOMPARE(changed.count(), 2);
 }
 
-void tst_DeclarativeWindow::zeroAllowedOrientationsIsRefused()
+void tst_DeclarativeWindow::invalidOrientationsAreRefused_data()
 {
+    QTest::addColumn<QByteArray>("property");
+    QTest::addColumn<int>("value");
+    QTest::addColumn<QString>("warning");
+    QTest::newRow("no allowed orientation") << QByteArray("_allowedOrientations") << 0 << "Invalid allowedOrientations value: 0";
+    QTest::newRow("device facing two ways") << QByteArray("deviceOrientation") << 5 << "Invalid deviceOrientation value: 5";
+    QTest::newRow("device facing nowhere") << QByteArray("deviceOrientation") << 0 << "Invalid deviceOrientation value: 0";
+    QTest::newRow("device past the four") << QByteArray("deviceOrientation") << 16 << "Invalid deviceOrientation value: 10";
+}
+
+void tst_DeclarativeWindow::invalidOrientationsAreRefused()
+{
+    QFETCH(QByteArray, property);
+    QFETCH(int, value);
+    QFETCH(QString, warning);
     DeclarativeWindow window;
-    window.setAllowedOrientations(O::Landscape);
-    QSignalSpy changed(&window, &DeclarativeWindow::_allowedOrientationsChanged);
-    QTest::ignoreMessage(QtWarningMsg, "Invalid allowedOrientations value: 0");
-    QVERIFY(window.setProperty("_allowedOrientations", 0));
-    QCOMPARE(window.allowedOrientations(), O::Orientations(O::Landscape));
+    window.setAllowedOrientations(O::Landscape | O::Portrait);
+    window.setDeviceOrientation(O::Landscape);
+    QSignalSpy allowedChanged(&window, &DeclarativeWindow::_allowedOrientationsChanged);
+    QSignalSpy deviceChanged(&window, &DeclarativeWindow::deviceOrientationChanged);
+    QTest::ignoreMessage(QtWarningMsg, qPrintable(warning));
+    QVERIFY(window.setProperty(property, value));
+    QCOMPARE(window.allowedOrientations(), O::Landscape | O::Portrait);
+    QCOMPARE(window.deviceOrientation(), O::Landscape);
     QCOMPARE(window.orientation(), O::Landscape);
-    QCOMPARE(changed.count(), 0);
+    QCOMPARE(allowedChanged.count() + deviceChanged.count(), 0);
 }
 
 void tst_DeclarativeWindow::pageOrientationFollowsUntilSet()
@@ -322,7 +340,7 @@ void tst_DeclarativeWindow::leavingTheWindowWarnsOnlyForATree()
     QCOMPARE(warnings, 0);
 }
 
-void tst_DeclarativeWindow::noPropertiesOffWayland()
+void tst_DeclarativeWindow::offWaylandOnlyTheColour()
 {
     WindowPropertyPublisher::setSinkForTesting([this](QWindow *, const QString &name, const QVariant &value) {
         m_published.append({ name, value });
@@ -337,6 +355,14 @@ void tst_DeclarativeWindow::noPropertiesOffWayland()
     window->_setCover(cover);
     delete cover;
     QVERIFY(m_published.isEmpty());
+
+    // The colour is the window's own, not a compositor property: it applies everywhere,
+    // also when declared before the item has a window.
+    window->setParentItem(nullptr);
+    window->setBackgroundColor(QColor(Qt::darkCyan));
+    window->setParentItem(m_window->contentItem());
+    QCOMPARE(m_window->color(), QColor(Qt::darkCyan));
+    QCOMPARE(window->backgroundColor(), QColor(Qt::darkCyan));
 }
 
 void tst_DeclarativeWindow::nothingWithoutANativeHandle()
