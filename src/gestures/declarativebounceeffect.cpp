@@ -170,6 +170,7 @@ void DeclarativeBounceEffect::windowEvent(QEvent *event)
         break;
     case QEvent::MouseButtonRelease:
     case QEvent::TouchEnd:
+    case QEvent::TouchCancel: // the system took the touch away: over as much as a lift
         m_pressedInside = false;
         if (m_active)
             deactivate();

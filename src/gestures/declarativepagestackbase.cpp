@@ -146,7 +146,14 @@ bool DeclarativePageStackBase::handleMouse(QMouseEvent *event)
             + QPointF(m_currentContainer->x(), m_currentContainer->y());
     const QPointF position = mapToItem(m_currentPage, inParent);
     if (event->type() == QEvent::MouseButtonPress) {
-        handlePress(position);
+        // Qt filters one touch press twice: as the touch and as the mouse made from it.
+        // Both carry the same time and place; a later press of the same finger does not.
+        const bool repeated = m_pressed && event->timestamp() == m_pressTimestamp
+                && event->windowPos() == m_pressWindowPosition;
+        m_pressTimestamp = event->timestamp();
+        m_pressWindowPosition = event->windowPos();
+        if (!repeated)
+            handlePress(position);
         return false;
     }
     return handleMove(position);

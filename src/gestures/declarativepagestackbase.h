@@ -126,6 +126,8 @@ private:
     bool m_trackingUp = false;
     bool m_trackingDown = false;
     QPointF m_pressPosition;
+    QPointF m_pressWindowPosition;
+    ulong m_pressTimestamp = 0;
     QPointer<QQuickItem> m_currentContainer;
     QPointer<QQuickItem> m_currentPage;
     QHash<QString, QString> m_importCache;

@@ -650,27 +650,43 @@ void DeclarativeWindow::dispatch(QEvent *event)
     }
 
     // Qt Quick turns touches into mouse events only inside its item delivery, where the
-    // window never sees them; observers written for the mouse get the same here.
-    QEvent::Type mouseType = QEvent::None;
-    switch (event->type()) {
-    case QEvent::TouchBegin:
-        mouseType = QEvent::MouseButtonPress;
-        break;
-    case QEvent::TouchUpdate:
-        mouseType = QEvent::MouseMove;
-        break;
-    case QEvent::TouchEnd:
-        mouseType = QEvent::MouseButtonRelease;
-        break;
-    default:
+    // window never sees them; observers written for the mouse get the same here. Like a
+    // mouse, they follow one finger: the first to go down, until it lifts; the others are
+    // ignored until a finger goes down again after that.
+    const QEvent::Type type = event->type();
+    if (type == QEvent::TouchCancel) {
+        m_touchPointId = -1;
         return;
     }
-    const QList<QTouchEvent::TouchPoint> points = static_cast<QTouchEvent *>(event)->touchPoints();
-    if (points.isEmpty())
+    if (type != QEvent::TouchBegin && type != QEvent::TouchUpdate && type != QEvent::TouchEnd)
         return;
-    const QTouchEvent::TouchPoint &primary = points.first();
+    if (type == QEvent::TouchBegin)
+        m_touchPointId = -1; // no finger was down, whatever was missed before
+    const QList<QTouchEvent::TouchPoint> points = static_cast<QTouchEvent *>(event)->touchPoints();
+    const QTouchEvent::TouchPoint *followed = nullptr;
+    for (const QTouchEvent::TouchPoint &point : points) {
+        const bool candidate = m_touchPointId < 0 ? point.state() == Qt::TouchPointPressed : point.id() == m_touchPointId;
+        if (candidate) {
+            followed = &point;
+            break;
+        }
+    }
+    if (!followed)
+        return;
+
+    QEvent::Type mouseType = QEvent::MouseMove;
+    if (m_touchPointId < 0) {
+        m_touchPointId = followed->id();
+        mouseType = QEvent::MouseButtonPress;
+    } else if (followed->state() == Qt::TouchPointReleased || type == QEvent::TouchEnd) {
+        m_touchPointId = -1;
+        mouseType = QEvent::MouseButtonRelease;
+    } else if (followed->state() != Qt::TouchPointMoved) {
+        return;
+    }
     const Qt::MouseButtons buttons = mouseType == QEvent::MouseButtonRelease ? Qt::NoButton : Qt::LeftButton;
-    QMouseEvent mouse(mouseType, primary.pos(), primary.pos(), primary.screenPos(), Qt::LeftButton, buttons,
+    QMouseEvent mouse(mouseType, followed->pos(), followed->pos(), followed->screenPos(), Qt::LeftButton, buttons,
                       Qt::NoModifier, Qt::MouseEventSynthesizedByQt);
+    mouse.setTimestamp(static_cast<QTouchEvent *>(event)->timestamp());
     dispatch(&mouse);
 }

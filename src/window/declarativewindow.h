@@ -196,4 +196,5 @@ private:
     QColor m_backgroundColor;
     QSet<WindowEventObserver *> m_observers;
     QVector<QPointer<QObject>> m_pendingDeletions;
+    int m_touchPointId = -1; // the finger observers follow, -1 while none
 };

@@ -6,6 +6,7 @@
 #include <QQuickView>
 #include <QStyleHints>
 #include <QtTest>
+#include <qpa/qwindowsysteminterface.h>
 
 // An application window with a flickable in its top half; the effect watches it. The
 // flickable stops at its bounds so that only the effect reacts to over-edge drags.
@@ -41,7 +42,8 @@ private Q_SLOTS:
     void fittingContentNeedsAMenu();
     void pressOutsideIsIgnored();
     void differenceKeptAfterRelease();
-    void touchDragActivates();
+    void touch_data();
+    void touch();
     void detachedWhileNotInteractive();
 
 private:
@@ -132,18 +134,65 @@ void tst_DeclarativeBounceEffect::differenceKeptAfterRelease()
     QCOMPARE(effect->difference(), 12.0f);
 }
 
-void tst_DeclarativeBounceEffect::touchDragActivates()
+void tst_DeclarativeBounceEffect::touch_data()
 {
+    // Steps: "p<id> y" press, "m<id> y" move, "r<id>" release of a finger at x 100 (the
+    // other fingers stay where they are), "c" cancel; "T" stands for the drag distance.
+    QTest::addColumn<QStringList>("steps");
+    QTest::addColumn<bool>("active");
+    QTest::addColumn<float>("difference");
+    QTest::newRow("one finger") << QStringList{ "p0 100", "m0 100+T", "m0 108+T" } << true << 8.0f;
+    QTest::newRow("lifted") << QStringList{ "p0 100", "m0 100+T", "m0 108+T", "r0" } << false << 8.0f;
+    QTest::newRow("a second finger is not followed")
+            << QStringList{ "p0 100", "p1 280", "m1 290+T", "m1 299+T" } << false << 0.0f;
+    QTest::newRow("the first finger lifts, the second moves")
+            << QStringList{ "p0 100", "p1 280", "r0", "m1 282", "m1 290+T" } << false << 0.0f;
+    QTest::newRow("cancelled") << QStringList{ "p0 100", "m0 100+T", "m0 150+T", "c" } << false << 50.0f;
+    QTest::newRow("a touch after a cancel anchors afresh")
+            << QStringList{ "p0 100", "m0 100+T", "m0 150+T", "c", "p0 200", "m0 202" } << false << 50.0f;
+}
+
+void tst_DeclarativeBounceEffect::touch()
+{
+    QFETCH(QStringList, steps);
+    QFETCH(bool, active);
+    QFETCH(float, difference);
     DeclarativeBounceEffect *effect = load(1000, false);
     QVERIFY(effect);
     QTouchDevice *device = QTest::createTouchDevice();
-    QTest::touchEvent(m_view.data(), device).press(0, QPoint(100, 100));
-    QTest::touchEvent(m_view.data(), device).move(0, QPoint(100, 100 + t()));
-    QTest::touchEvent(m_view.data(), device).move(0, QPoint(100, 100 + t() + 8));
-    QVERIFY(effect->active());
-    QCOMPARE(effect->difference(), 8.0f);
-    QTest::touchEvent(m_view.data(), device).release(0, QPoint(100, 100 + t() + 8));
-    QVERIFY(!effect->active());
+    QMap<int, int> down; // finger id -> y
+    for (const QString &step : qAsConst(steps)) {
+        const int id = step.midRef(1, 1).toInt();
+        QString y = step.section(QLatin1Char(' '), 1);
+        y.replace(QLatin1Char('T'), QString::number(t()));
+        const int at = y.section(QLatin1Char('+'), 0, 0).toInt() + y.section(QLatin1Char('+'), 1).toInt();
+        if (step == QLatin1String("c")) {
+            QWindowSystemInterface::handleTouchCancelEvent<QWindowSystemInterface::SynchronousDelivery>(m_view.data(), device);
+            down.clear();
+            continue;
+        }
+        QTest::QTouchEventSequence sequence = QTest::touchEvent(m_view.data(), device);
+        for (auto it = down.cbegin(); it != down.cend(); ++it) {
+            if (it.key() != id)
+                sequence.stationary(it.key());
+        }
+        if (step.startsWith(QLatin1Char('p')))
+            sequence.press(id, QPoint(100, at));
+        else if (step.startsWith(QLatin1Char('m')))
+            sequence.move(id, QPoint(100, at));
+        else
+            sequence.release(id, QPoint(100, down.value(id)));
+        sequence.commit();
+        if (step.startsWith(QLatin1Char('r')))
+            down.remove(id);
+        else
+            down.insert(id, at);
+    }
+    QCOMPARE(effect->active(), active);
+    QCOMPARE(effect->difference(), difference);
+    QTest::QTouchEventSequence end = QTest::touchEvent(m_view.data(), device);
+    for (auto it = down.cbegin(); it != down.cend(); ++it)
+        end.release(it.key(), QPoint(100, it.value()));
 }
 
 void tst_DeclarativeBounceEffect::detachedWhileNotInteractive()

@@ -8,6 +8,7 @@
 #include <QStyleHints>
 #include <QTemporaryDir>
 #include <QtTest>
+#include <qpa/qwindowsysteminterface.h>
 
 // Stands in for a slider: takes the press and holds its grab firmly.
 class FirmGrabber : public QQuickItem
@@ -51,6 +52,8 @@ private Q_SLOTS:
     void verticalStyle();
     void firmGrabOfAChildWins();
     void losingTheGrabCancels();
+    void touchPressAnnouncedOnce_data();
+    void touchPressAnnouncedOnce();
     void busyOnlyWhenCrossingZero();
     void backKey_data();
     void backKey();
@@ -260,6 +263,36 @@ void tst_DeclarativePageStackBase::losingTheGrabCancels()
     other->grabMouse();
     QCOMPARE(m_events, QStringList({ QStringLiteral("canceled l40 r0 u0 d0"), QStringLiteral("left l0 r0 u0 d0") }));
     QVERIFY(!m_stack->isPressed());
+}
+
+void tst_DeclarativePageStackBase::touchPressAnnouncedOnce_data()
+{
+    QTest::addColumn<bool>("cancelFirst");
+    QTest::addColumn<QStringList>("expected");
+    const QString pressed = QStringLiteral("pressed l0 r0 u0 d0");
+    QTest::newRow("press, release, press") << false << QStringList({ pressed, QStringLiteral("released l0 r0 u0 d0"), pressed });
+    QTest::newRow("press, cancel, press") << true << QStringList({ pressed, QStringLiteral("canceled l0 r0 u0 d0"), pressed });
+}
+
+// Qt hands one touch press to a filtering parent both as touch and as synthesised mouse.
+void tst_DeclarativePageStackBase::touchPressAnnouncedOnce()
+{
+    QFETCH(bool, cancelFirst);
+    QFETCH(QStringList, expected);
+    QSignalSpy pressedChanges(m_stack, &DeclarativePageStackBase::pressedChanged);
+    QTouchDevice *device = QTest::createTouchDevice();
+    QTest::touchEvent(m_window.data(), device).press(0, QPoint(100, 300));
+    QVERIFY(m_stack->isPressed());
+    if (cancelFirst) {
+        QWindowSystemInterface::handleTouchCancelEvent<QWindowSystemInterface::SynchronousDelivery>(m_window.data(), device);
+    } else {
+        QTest::touchEvent(m_window.data(), device).release(0, QPoint(100, 300));
+    }
+    // The same place again, as quickly as a test can: still a press of its own.
+    QTest::touchEvent(m_window.data(), device).press(0, QPoint(100, 300));
+    QCOMPARE(m_events, expected);
+    QCOMPARE(pressedChanges.count(), 3);
+    QTest::touchEvent(m_window.data(), device).release(0, QPoint(100, 300));
 }
 
 void tst_DeclarativePageStackBase::busyOnlyWhenCrossingZero()
