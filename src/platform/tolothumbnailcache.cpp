@@ -4,7 +4,9 @@
 
 #include <QCryptographicHash>
 #include <QDir>
+#include <QDateTime>
 #include <QFileInfo>
+#include <QImageReader>
 #include <QSaveFile>
 
 ToloThumbnailCache::ToloThumbnailCache(const QString &cacheDirectory)
@@ -24,17 +26,38 @@ QString ToloThumbnailCache::cachePath(const QString &source, const QSize &size, 
             .arg(crop ? QStringLiteral("-crop") : QString());
 }
 
+namespace {
+
+// What an entry remembers of its source: any change of either, to an older or a newer
+// file alike, makes the entry stale.
+const QString SourceSizeKey = QStringLiteral("Source-Size");
+const QString SourceModifiedKey = QStringLiteral("Source-Modified");
+
+QString sourceSize(const QFileInfo &source)
+{
+    return QString::number(source.size());
+}
+
+QString sourceModified(const QFileInfo &source)
+{
+    return QString::number(source.lastModified().toMSecsSinceEpoch());
+}
+
+} // namespace
+
 ToloThumbnailCache::ThumbnailData ToloThumbnailCache::requestThumbnail(const QString &source, const QSize &size,
                                                                        bool crop, bool unbounded)
 {
     const QString path = cachePath(source, size, crop);
-    const QFileInfo cached(path);
     const QFileInfo original(source);
-    if (cached.exists() && original.exists() && cached.lastModified() >= original.lastModified()) {
-        QImage image(path);
-        if (!image.isNull())
-            return { path, image };
-        // A damaged entry is made again below.
+    if (original.exists() && QFileInfo::exists(path)) {
+        QImageReader entry(path, "png");
+        if (entry.text(SourceSizeKey) == sourceSize(original) && entry.text(SourceModifiedKey) == sourceModified(original)) {
+            const QImage image = entry.read();
+            if (!image.isNull())
+                return { path, image };
+        }
+        // A stale or damaged entry is made again below.
     }
     return generateThumbnail(source, path, size, crop, unbounded);
 }
@@ -45,7 +68,7 @@ ToloThumbnailCache::ThumbnailData ToloThumbnailCache::generateThumbnail(const QS
     const QImage image = readImageThumbnail(source, size, crop, unbounded);
     if (image.isNull())
         return {};
-    return { writeCacheFile(cachePath, image), image };
+    return { writeCacheFile(cachePath, image, source), image };
 }
 
 QImage ToloThumbnailCache::readImageThumbnail(const QString &source, const QSize &size, bool crop, bool unbounded)
@@ -91,11 +114,17 @@ QImage ToloThumbnailCache::readImageThumbnail(const QString &source, const QSize
     return image;
 }
 
-QString ToloThumbnailCache::writeCacheFile(const QString &path, const QImage &image)
+QString ToloThumbnailCache::writeCacheFile(const QString &path, const QImage &image, const QString &source)
 {
     QDir().mkpath(QFileInfo(path).absolutePath());
+    QImage entry = image;
+    if (!source.isEmpty()) {
+        const QFileInfo original(source);
+        entry.setText(SourceSizeKey, sourceSize(original));
+        entry.setText(SourceModifiedKey, sourceModified(original));
+    }
     QSaveFile file(path);
-    if (!file.open(QIODevice::WriteOnly) || !image.save(&file, "PNG") || !file.commit()) {
+    if (!file.open(QIODevice::WriteOnly) || !entry.save(&file, "PNG") || !file.commit()) {
         qCWarning(lcPelkanCoreLog) << "Thumbnail: cannot write" << path << ":" << file.errorString();
         return QString();
     }

@@ -4,10 +4,11 @@
 #include <QSize>
 #include <QString>
 
-// A thumbnail cache on disk: one file per source, size and crop, kept while it is newer
-// than its source. Subclasses decide how a missing entry is made (generateThumbnail);
-// the default reads the source at the asked size. Not thread-safe: use one cache per
-// thread (the files themselves are written atomically, so caches may share a folder).
+// A thumbnail cache on disk: one file per source, size and crop, kept while its source
+// keeps the size and modification time it had when the entry was made. Subclasses decide
+// how a missing entry is made (generateThumbnail); the default reads the source at the
+// asked size. Not thread-safe: use one cache per thread (the files themselves are
+// written atomically, so caches may share a folder).
 class ToloThumbnailCache
 {
 public:
@@ -36,8 +37,9 @@ protected:
 
     // Reads source scaled for size (see requestThumbnail); a null image when unreadable.
     static QImage readImageThumbnail(const QString &source, const QSize &size, bool crop, bool unbounded);
-    // Writes image to path atomically; returns path, or an empty text on failure.
-    static QString writeCacheFile(const QString &path, const QImage &image);
+    // Writes image to path atomically, noting what source looked like then; returns path,
+    // or an empty text on failure.
+    static QString writeCacheFile(const QString &path, const QImage &image, const QString &source = QString());
 
 private:
     QString m_directory;

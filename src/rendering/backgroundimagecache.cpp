@@ -33,5 +33,5 @@ ToloThumbnailCache::ThumbnailData BackgroundImageCache::generateThumbnail(const 
     if (image.isNull())
         return {};
     const QImage processed = m_background.apply(image);
-    return { writeCacheFile(cachePath, processed), processed };
+    return { writeCacheFile(cachePath, processed, source), processed };
 }

@@ -20,6 +20,8 @@ private Q_SLOTS:
     void sizes_data();
     void sizes();
     void processedAndCached();
+    void changedSourceIsMadeAgain_data();
+    void changedSourceIsMadeAgain();
     void unreadableSource();
     void loaderThreads();
 
@@ -98,15 +100,41 @@ void tst_BackgroundImageProvider::processedAndCached()
     image = provider.requestImage(source, &size, QSize(40, 20));
     QCOMPARE(image.pixel(5, 10), qRgb(255, 255, 255));
     QCOMPARE(QFileInfo(cached).lastModified(), written);
+}
 
-    // A changed source is made again.
-    QCOMPARE(writeSource(QStringLiteral("cached.png"), Qt::blue), source);
+void tst_BackgroundImageProvider::changedSourceIsMadeAgain_data()
+{
+    QTest::addColumn<int>("shift"); // seconds the new file's time lies from the old one's
+    QTest::addColumn<bool>("sameSize");
+    QTest::newRow("newer file") << 10 << true;
+    QTest::newRow("older file, as cp -p leaves it") << -3600 << true;
+    QTest::newRow("same time, other size") << 0 << false;
+}
+
+void tst_BackgroundImageProvider::changedSourceIsMadeAgain()
+{
+    QFETCH(int, shift);
+    QFETCH(bool, sameSize);
+    const QString source = writeSource(QStringLiteral("changed-%1.png").arg(QTest::currentDataTag()));
+    BackgroundImageProvider provider;
+    QSize size;
+    QCOMPARE(provider.requestImage(source, &size, QSize(40, 20)).pixel(5, 10), qRgb(255, 255, 255));
+    const qint64 sizeBefore = QFileInfo(source).size();
+    const QDateTime timeBefore = QFileInfo(source).lastModified();
+
+    QImage replacement(40, 20, QImage::Format_ARGB32);
+    replacement.fill(Qt::transparent);
+    QPainter(&replacement).fillRect(0, 0, 20, 20, Qt::blue);
+    if (!sameSize)
+        replacement.setText(QStringLiteral("Comment"), QStringLiteral("a longer file, the same picture"));
+    QVERIFY(replacement.save(source));
     QFile file(source);
     QVERIFY(file.open(QIODevice::ReadWrite));
-    QVERIFY(file.setFileTime(written.addSecs(10), QFileDevice::FileModificationTime));
+    QVERIFY(file.setFileTime(timeBefore.addSecs(shift), QFileDevice::FileModificationTime));
     file.close();
-    image = provider.requestImage(source, &size, QSize(40, 20));
-    QCOMPARE(image.pixel(5, 10), qRgb(0, 0, 255));
+    QCOMPARE(QFileInfo(source).size() == sizeBefore, sameSize);
+
+    QCOMPARE(provider.requestImage(source, &size, QSize(40, 20)).pixel(5, 10), qRgb(0, 0, 255));
 }
 
 void tst_BackgroundImageProvider::unreadableSource()
