@@ -12,7 +12,14 @@ QQuickTextureFactory *TransientImageProvider::requestTexture(const QString &id, 
 {
     const QUrl url(id);
     auto factory = new TransientImageTextureFactory(url.isLocalFile() ? url.toLocalFile() : id, requestedSize);
+    const QSize decoded = factory->textureSize();
     if (size)
-        *size = factory->textureSize();
+        *size = decoded;
+    // Nothing to show (reported by the factory): the image element ends in its error
+    // state, where an application's fallback can take over.
+    if (decoded.isEmpty()) {
+        delete factory;
+        return nullptr;
+    }
     return factory;
 }

@@ -31,7 +31,7 @@ void TransientImageTextureFactory::decode() const
     // refused for their kind or size were reported by the reader.
     const bool refused = status == BoundedImageReader::NotRegularFile || status == BoundedImageReader::TooLarge;
     if (m_image.isNull() && !m_decoded && !refused)
-        qCWarning(lcPelkanCoreLog) << "TransientImageProvider: cannot read" << m_path << ":"
+        qCWarning(lcPelkanCoreLog).noquote() << "TransientImageProvider: cannot read" << m_path << ":"
                                    << (status == BoundedImageReader::Missing ? QStringLiteral("file not found") : reader.errorString());
     m_decoded = true;
 }
