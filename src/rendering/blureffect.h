@@ -11,7 +11,8 @@ class BlurEffectTextureProvider;
 // Gaussian of the given kernel and deviation, run over `levels` levels, each half the
 // size of the one before, with `iterations` rounds on the last level (or on every level
 // with IterateAllLayers). A source item that is not a texture provider gets its layer
-// enabled. The blurred copy is offered to other items as this item's texture.
+// enabled for as long as it is the source. The blurred copy is offered to other items as
+// this item's texture.
 class BlurEffect : public QQuickItem
 {
     Q_OBJECT
@@ -84,10 +85,12 @@ private:
     void assign(T &field, const T &value, Signal signal);
     void storeDeviation(float deviation);
     void sourceDestroyed();
+    void restoreLayer();
 
     bool m_blur = true;
     bool m_blurExplicit = false;
     QPointer<QQuickItem> m_sourceItem;
+    QPointer<QQuickItem> m_layerEnabledOn; // the source whose layer this effect switched on
     Kernel m_kernel = Gaussian9;
     int m_levels = 3;
     int m_iterations = 1;

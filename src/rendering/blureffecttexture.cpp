@@ -1,4 +1,5 @@
 #include "blureffecttexture.h"
+#include "blureffectexacttexture.h"
 #include "blureffectshaderprogram.h"
 #include "blurkernel.h"
 #include "pelkanlogging.h"
@@ -64,6 +65,13 @@ QRectF BlurEffectTexture::normalizedTextureSubRect() const
     const QSizeF full = m_normal->size();
     return QRectF(0.5 / full.width(), 0.5 / full.height(), (m_result.width() - 1) / full.width(),
                   (m_result.height() - 1) / full.height());
+}
+
+QSGTexture *BlurEffectTexture::removedFromAtlas() const
+{
+    if (!m_exact)
+        m_exact.reset(new BlurEffectExactTexture(this));
+    return m_exact.get();
 }
 
 void BlurEffectTexture::bind()
@@ -183,6 +191,7 @@ bool BlurEffectTexture::render(QSGTexture *source, BlurEffectShaderProgram *prog
             size = BlurKernel::halved(size);
     }
     m_result = QRect(QPoint(0, 0), previousLevel);
+    ++m_renderCount;
 
     for (int attribute : attributes)
         p.disableAttributeArray(attribute);

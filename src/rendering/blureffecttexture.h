@@ -7,6 +7,7 @@
 
 #include <memory>
 
+class BlurEffectExactTexture;
 class BlurEffectShaderProgram;
 class QOpenGLBuffer;
 class QOpenGLFramebufferObject;
@@ -34,6 +35,13 @@ public:
     bool hasMipmaps() const override { return false; }
     QRectF normalizedTextureSubRect() const override;
     void bind() override;
+    // The result is a corner of a larger texture, as an atlas entry is: consumers that
+    // cannot honour the sub-rectangle ask for a texture of its own.
+    bool isAtlasTexture() const override { return true; }
+    QSGTexture *removedFromAtlas() const override;
+
+    QOpenGLFramebufferObject *framebuffer() const { return m_normal.get(); }
+    quint64 renderCount() const { return m_renderCount; }
 
 private:
     bool ensureTargets(const QSize &size);
@@ -44,4 +52,6 @@ private:
     std::unique_ptr<QOpenGLFramebufferObject> m_transposed; // width and height swapped
     std::unique_ptr<QOpenGLBuffer> m_vertices;
     QRect m_result; // the final level, in m_normal
+    quint64 m_renderCount = 0;
+    mutable std::unique_ptr<BlurEffectExactTexture> m_exact;
 };

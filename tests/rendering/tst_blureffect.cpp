@@ -27,6 +27,10 @@ private Q_SLOTS:
     void onScreen();
     void followsALiveSource();
     void sameBothWays();
+    void asTextureProvider_data();
+    void asTextureProvider();
+    void layerGivenBack_data();
+    void layerGivenBack();
 };
 
 void tst_BlurEffect::weights_data()
@@ -198,6 +202,67 @@ void tst_BlurEffect::sameBothWays()
     // And it does spread: the middle is no longer white, the corners of the square are lit.
     QVERIFY(qRed(grab.pixel(180, 60)) < 200);
     QVERIFY(qRed(grab.pixel(180 + 16, 60)) > 10);
+}
+
+void tst_BlurEffect::asTextureProvider_data()
+{
+    QTest::addColumn<QByteArray>("consumer");
+    QTest::newRow("ShaderEffect") << QByteArray("ShaderEffect { property variant source: blur");
+    QTest::newRow("ShaderEffectSource") << QByteArray("ShaderEffectSource { sourceItem: blur");
+}
+
+// Three levels leave the result in a corner of the offscreen texture: whoever reads the
+// blur as a texture must see the result alone, as the effect itself draws it.
+void tst_BlurEffect::asTextureProvider()
+{
+    QFETCH(QByteArray, consumer);
+    QQuickView view;
+    QQuickItem *root = showScene(view, "import QtQuick 2.6\n"
+                                   "import Quorvane.Pelkan.private 1.0\n"
+                                   "Rectangle { width: 300; height: 100; color: 'blue'\n"
+                                   "  Rectangle { id: source; width: 100; height: 100; color: 'black'\n"
+                                   "    Rectangle { width: 50; height: 100; color: 'white' } }\n"
+                                   "  BlurEffect { id: blur; x: 100; width: 100; height: 100; sourceItem: source; levels: 3 }\n"
+                                   "  " + consumer + "; x: 200; width: 100; height: 100 }\n"
+                                   "}\n");
+    QVERIFY(root);
+    QImage grab;
+    QTRY_VERIFY((grab = view.grabWindow(), qBlue(grab.pixel(150, 50)) < 200 && qBlue(grab.pixel(250, 50)) < 200));
+    for (int x : { 5, 30, 50, 70, 95 }) {
+        for (int y : { 10, 50, 90 }) {
+            const int own = qRed(grab.pixel(100 + x, y));
+            const int read = qRed(grab.pixel(200 + x, y));
+            QVERIFY2(qAbs(own - read) <= 12, qPrintable(QStringLiteral("at %1,%2: %3 drawn, %4 read").arg(x).arg(y).arg(own).arg(read)));
+        }
+    }
+}
+
+void tst_BlurEffect::layerGivenBack_data()
+{
+    QTest::addColumn<bool>("layerWasOn");
+    QTest::addColumn<bool>("destroyBlur"); // otherwise the source changes
+    QTest::newRow("source changed") << false << false;
+    QTest::newRow("blur destroyed") << false << true;
+    QTest::newRow("a layer the application enabled stays") << true << true;
+}
+
+void tst_BlurEffect::layerGivenBack()
+{
+    QFETCH(bool, layerWasOn);
+    QFETCH(bool, destroyBlur);
+    QQuickItem source, other;
+    auto layerOn = [](QQuickItem &item) { return item.property("layer").value<QObject *>()->property("enabled").toBool(); };
+    source.property("layer").value<QObject *>()->setProperty("enabled", layerWasOn);
+    QScopedPointer<BlurEffect> blur(new BlurEffect);
+    blur->setSourceItem(&source);
+    QVERIFY(layerOn(source));
+    if (destroyBlur) {
+        blur.reset();
+    } else {
+        blur->setSourceItem(&other);
+        QVERIFY(layerOn(other));
+    }
+    QCOMPARE(layerOn(source), layerWasOn);
 }
 
 QTEST_MAIN(tst_BlurEffect)
