@@ -52,6 +52,7 @@ void GlassMaterialShader::initialize()
     m_size = p->uniformLocation("size");
     m_dash = p->uniformLocation("dash");
     m_pattern = p->uniformLocation("patternTexture");
+    m_patternWeight = p->uniformLocation("patternWeight");
 }
 
 void GlassMaterialShader::updateState(const RenderState &state, QSGMaterial *newMaterial, QSGMaterial *)
@@ -64,6 +65,7 @@ void GlassMaterialShader::updateState(const RenderState &state, QSGMaterial *new
         p->setUniformValue(m_opacity, state.opacity());
 
     QSize textureSize(1, 1);
+    bool patterned = false;
     if (QSGTexture *texture = glass.pattern) {
         // The pattern tiles across the screen: it needs a texture of its own.
         if (texture->isAtlasTexture())
@@ -74,8 +76,12 @@ void GlassMaterialShader::updateState(const RenderState &state, QSGMaterial *new
             state.context()->functions()->glActiveTexture(GL_TEXTURE0);
             texture->bind();
             textureSize = texture->textureSize().expandedTo(QSize(1, 1));
+            patterned = true;
         }
     }
+    // Without a pattern (not loaded, or failed) the glass reads as with a clear one, not
+    // whatever texture the previous draw left bound.
+    p->setUniformValue(m_patternWeight, patterned ? 1.0f : 0.0f);
     // One texel per device pixel, anchored to the screen, y pointing down.
     const QRect viewport = state.viewportRect();
     QMatrix4x4 pattern;

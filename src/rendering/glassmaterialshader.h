@@ -22,5 +22,6 @@ private:
     QByteArray m_vertex;
     QByteArray m_fragment;
     int m_matrix = -1, m_patternMatrix = -1, m_opacity = -1, m_color = -1, m_backgroundColor = -1,
-        m_centersize = -1, m_border = -1, m_sigma = -1, m_brightness = -1, m_size = -1, m_dash = -1, m_pattern = -1;
+        m_centersize = -1, m_border = -1, m_sigma = -1, m_brightness = -1, m_size = -1, m_dash = -1, m_pattern = -1,
+        m_patternWeight = -1;
 };

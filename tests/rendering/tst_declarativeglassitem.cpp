@@ -6,6 +6,7 @@
 #include <QQmlEngine>
 #include <QQuickItem>
 #include <QQuickView>
+#include <QTemporaryDir>
 #include <QtTest>
 
 static int luminance(QRgb pixel)
@@ -25,6 +26,7 @@ private Q_SLOTS:
     void glowIsBrightestInTheMiddle();
     void dashesOnlyWhenDashed_data();
     void dashesOnlyWhenDashed();
+    void missingPatternDrawsAsClear();
 
 private:
     QImage render(const QByteArray &glass, const QSize &size);
@@ -131,6 +133,36 @@ void tst_DeclarativeGlassItem::dashesOnlyWhenDashed()
         QVERIFY2(darkest < 40, qPrintable(QString::number(darkest)));
     else
         QVERIFY2(darkest > 120, qPrintable(QString::number(darkest)));
+}
+
+// A pattern that never loads leaves the glass as a clear pattern would, not reading
+// whatever texture the image drawn before it left bound (a white one, too large for
+// Qt's atlas).
+void tst_DeclarativeGlassItem::missingPatternDrawsAsClear()
+{
+    QTemporaryDir dir;
+    QImage clear(8, 8, QImage::Format_ARGB32);
+    clear.fill(Qt::transparent);
+    QImage white(1024, 16, QImage::Format_ARGB32);
+    white.fill(Qt::white);
+    QVERIFY(clear.save(dir.filePath(QStringLiteral("clear.png"))) && white.save(dir.filePath(QStringLiteral("white.png"))));
+    auto centre = [&](const QString &pattern) {
+        QQuickView view;
+        view.setColor(Qt::black);
+        if (!showScene(view, "import QtQuick 2.6\nimport Quorvane.Pelkan 1.0\n"
+                             "Item { width: 200; height: 200\n"
+                             "  Image { width: 8; height: 8; source: '" + QUrl::fromLocalFile(dir.filePath(QStringLiteral("white.png"))).toEncoded() + "' }\n"
+                             "  GlassItem { anchors.fill: parent; color: 'white'; brightness: 0.2; pattern: '" + QUrl::fromLocalFile(dir.filePath(pattern)).toEncoded() + "' } }\n"))
+            return -1;
+        for (int waited = 0; waited < 5000 && luminance(view.grabWindow().pixel(4, 4)) < 200; waited += 50)
+            QTest::qWait(50);
+        QTest::qWait(100); // the pattern, where there is one, arrives from its loader
+        return luminance(view.grabWindow().pixel(100, 100));
+    };
+    const int withClear = centre(QStringLiteral("clear.png"));
+    const int withMissing = centre(QStringLiteral("missing.png"));
+    QVERIFY(withClear >= 0);
+    QVERIFY2(qAbs(withClear - withMissing) <= 12, qPrintable(QStringLiteral("%1 with a clear pattern, %2 without").arg(withClear).arg(withMissing)));
 }
 
 QTEST_MAIN(tst_DeclarativeGlassItem)

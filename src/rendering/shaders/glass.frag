@@ -9,6 +9,7 @@ uniform lowp float brightness;
 uniform lowp float size;
 uniform mediump vec3 dash;
 uniform lowp sampler2D patternTexture;
+uniform lowp float patternWeight; // 0 while there is no pattern texture
 varying highp vec2 v_texCoord;
 varying highp vec2 v_patternCoord;
 
@@ -16,7 +17,7 @@ void main()
 {
     lowp float halfSize = size * 0.5;
     lowp float dashOpacity = 1.0;
-    lowp float pattern = texture2D(patternTexture, v_patternCoord).a;
+    lowp float pattern = patternWeight * texture2D(patternTexture, v_patternCoord).a;
     if (dash.x > halfSize) {
         mediump float p = mod(DASH_COORDINATE, dash.y);
         dashOpacity = smoothstep(0.0, halfSize, p) * (1.0 - smoothstep(dash.x - halfSize, dash.x, p));
