@@ -1,22 +1,16 @@
 #include "blureffectcache.h"
 #include "blureffectshaderprogram.h"
+#include "renderresourcerelease.h"
 
+#include <QOpenGLContext>
 #include <QQuickWindow>
 
 QMutex BlurEffectCache::s_mutex;
-QHash<QQuickWindow *, BlurEffectCache *> BlurEffectCache::s_caches;
+QHash<QOpenGLContext *, BlurEffectCache *> BlurEffectCache::s_caches;
 
 BlurEffectCache::BlurEffectCache(QQuickWindow *window)
-    : m_window(window)
 {
-    // Emitted on the render thread with the context still current: programs go there.
-    connect(window, &QQuickWindow::sceneGraphInvalidated, this, [this] {
-        {
-            QMutexLocker lock(&s_mutex);
-            s_caches.remove(m_window);
-        }
-        delete this;
-    }, Qt::DirectConnection);
+    RenderResourceRelease::watch(window, this, [this] { delete this; });
 }
 
 BlurEffectCache::~BlurEffectCache()
@@ -32,11 +26,20 @@ BlurEffectCache::~BlurEffectCache()
 
 BlurEffectCache *BlurEffectCache::forWindow(QQuickWindow *window)
 {
+    QOpenGLContext *context = QOpenGLContext::currentContext();
+    if (!window || !context)
+        return nullptr;
     QMutexLocker lock(&s_mutex);
-    BlurEffectCache *&cache = s_caches[window];
+    BlurEffectCache *&cache = s_caches[context];
     if (!cache)
         cache = new BlurEffectCache(window);
     return cache;
+}
+
+int BlurEffectCache::cacheCount()
+{
+    QMutexLocker lock(&s_mutex);
+    return s_caches.size();
 }
 
 BlurEffectShaderProgram *BlurEffectCache::program(int kernel)

@@ -8,10 +8,11 @@
 #include <memory>
 
 class BlurEffectShaderProgram;
+class QOpenGLContext;
 class QQuickWindow;
 
-// The blur programs of one window, one per kernel, made on first use on the window's
-// render thread and destroyed there when the window's scene graph goes away.
+// The blur programs of one GL context (shared by the windows that render with it), one
+// per kernel, made on first use on the render thread and destroyed with the context.
 class BlurEffectCache : public QObject
 {
     Q_OBJECT
@@ -19,8 +20,12 @@ class BlurEffectCache : public QObject
 public:
     ~BlurEffectCache() override;
 
-    // The cache of a window (render thread); made when missing.
+    // The cache of the context the window renders with (render thread, the context
+    // current); made when missing.
     static BlurEffectCache *forWindow(QQuickWindow *window);
+
+    // Caches there are now (one per GL context that drew a blur).
+    static int cacheCount();
 
     // The program for a kernel, or null when it does not compile.
     BlurEffectShaderProgram *program(int kernel);
@@ -28,9 +33,8 @@ public:
 private:
     explicit BlurEffectCache(QQuickWindow *window);
 
-    QPointer<QQuickWindow> m_window;
     QHash<int, std::shared_ptr<BlurEffectShaderProgram>> m_programs;
 
     static QMutex s_mutex;
-    static QHash<QQuickWindow *, BlurEffectCache *> s_caches;
+    static QHash<QOpenGLContext *, BlurEffectCache *> s_caches;
 };

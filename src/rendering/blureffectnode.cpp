@@ -83,7 +83,7 @@ void BlurEffectNode::preprocess()
     } else if (m_dirty) {
         if (!m_blurred)
             m_blurred.reset(new BlurEffectTexture);
-        BlurEffectShaderProgram *program = m_cache->program(m_parameters.kernel);
+        BlurEffectShaderProgram *program = m_cache ? m_cache->program(m_parameters.kernel) : nullptr;
         m_material.blur = program && m_blurred->render(source, program, m_parameters) ? m_blurred.get() : nullptr;
         m_dirty = false;
         if (m_provider)

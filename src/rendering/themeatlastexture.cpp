@@ -43,6 +43,6 @@ QSGTexture *ThemeAtlasTexture::removedFromAtlas() const
 {
     // A texture of its own for uses an atlas cannot serve (tiling, shader sources).
     if (!m_standalone && m_atlas)
-        m_standalone = new ThemeTexture(m_atlas, m_record, m_atlas->decodeAgain(m_record, false));
+        m_standalone = m_atlas->createStandalone(m_record, m_atlas->decodeAgain(m_record, false));
     return m_standalone;
 }

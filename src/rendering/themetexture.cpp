@@ -32,6 +32,8 @@ void ThemeTexture::bind()
     if (!context)
         return;
     QOpenGLFunctions *gl = context->functions();
+    if (m_atlas)
+        m_atlas->takeThemeChange();
     const bool upload = m_dirty;
     if (!m_texture)
         gl->glGenTextures(1, &m_texture);

@@ -22,10 +22,9 @@ ThemeTextureAtlas::~ThemeTextureAtlas()
         texture->detach();
     for (ThemeTexture *texture : qAsConst(m_standalone))
         texture->detach();
-    if (m_texture) {
-        if (QOpenGLContext *context = QOpenGLContext::currentContext())
-            context->functions()->glDeleteTextures(1, &m_texture);
-    }
+    // Released with its context: the name goes only where it was made.
+    if (m_texture && m_context && QOpenGLContext::currentContext() == m_context)
+        m_context->functions()->glDeleteTextures(1, &m_texture);
 }
 
 int ThemeTextureAtlas::sideFor(const QSize &windowSize, int maximumTextureSize)
@@ -54,9 +53,26 @@ QSGTexture *ThemeTextureAtlas::create(const ThemeImageRecord &record, const QStr
         }
     }
     const QImage plain = bordered.isNull() ? QImage() : bordered.copy(1, 1, bordered.width() - 2, bordered.height() - 2);
+    return createStandalone(record, plain);
+}
+
+ThemeTexture *ThemeTextureAtlas::createStandalone(const ThemeImageRecord &record, const QImage &plain)
+{
     auto texture = new ThemeTexture(this, record, plain);
     m_standalone.append(texture);
     return texture;
+}
+
+bool ThemeTextureAtlas::takeThemeChange()
+{
+    if (!m_themeChanged.exchange(false))
+        return false;
+    m_pending += m_uploaded;
+    m_uploaded.clear();
+    m_redecodePending = true;
+    for (ThemeTexture *texture : qAsConst(m_standalone))
+        texture->markDirty();
+    return true;
 }
 
 QImage ThemeTextureAtlas::decodeAgain(const ThemeImageRecord &record, bool bordered) const
@@ -90,17 +106,13 @@ bool ThemeTextureAtlas::bind()
             return false;
         }
         m_allocated = true;
+        m_context = context;
     } else {
         gl->glBindTexture(GL_TEXTURE_2D, m_texture);
     }
 
-    const bool themeChanged = m_themeChanged.exchange(false);
-    if (themeChanged) {
-        m_pending += m_uploaded;
-        m_uploaded.clear();
-        for (ThemeTexture *texture : qAsConst(m_standalone))
-            texture->markDirty();
-    }
+    takeThemeChange();
+    const bool themeChanged = std::exchange(m_redecodePending, false);
     for (ThemeAtlasTexture *texture : qAsConst(m_pending)) {
         const QImage image = themeChanged || !texture->hasImage() ? decodeAgain(texture->record(), true) : texture->takeImage();
         if (!image.isNull()) {

@@ -1,5 +1,6 @@
 #include "../common/configfixture.h"
 #include "../common/sceneview.h"
+#include "blureffectcache.h"
 #include "declarativeimageprovider.h"
 #include "theme.h"
 #include "themeiconresolver.h"
@@ -35,7 +36,12 @@ private Q_SLOTS:
     void corruptFileWarns();
     void concurrentRequests();
     void tintedIconsOnScreen();
+    void themeColourChangeRetints_data();
     void themeColourChangeRetints();
+    void themeKeysReachNewRequests_data();
+    void themeKeysReachNewRequests();
+    void missingIconReportedOnce();
+    void windowsComeAndGo();
 
 private:
     void writeIcon(const QString &name, const QSize &size, bool grayscale);
@@ -162,17 +168,30 @@ void tst_DeclarativeImageProvider::tintedIconsOnScreen()
     QVERIFY(near(grab.pixel(50, 26), Qt::black));
 }
 
+void tst_DeclarativeImageProvider::themeColourChangeRetints_data()
+{
+    // However the image is drawn: from the atlas, or from a texture of its own that Qt
+    // asks for when it mipmaps, tiles, or hands the texture to a shader.
+    QTest::addColumn<QByteArray>("image");
+    const QByteArray source = "source: 'image://theme/icon-themed'";
+    QTest::newRow("plain") << "Image { x: 10; y: 10; width: 32; height: 32; " + source + " }";
+    QTest::newRow("mipmap") << "Image { x: 10; y: 10; width: 32; height: 32; mipmap: true; " + source + " }";
+    QTest::newRow("tiled") << "Image { x: 10; y: 10; width: 64; height: 64; fillMode: Image.Tile; " + source + " }";
+    QTest::newRow("tiled horizontally") << "Image { x: 10; y: 10; width: 64; height: 32; fillMode: Image.TileHorizontally; " + source + " }";
+    QTest::newRow("shader effect source")
+            << "Image { id: icon; visible: false; " + source + " }\n"
+               "  ShaderEffect { x: 10; y: 10; width: 32; height: 32; property variant source: icon }";
+}
+
 void tst_DeclarativeImageProvider::themeColourChangeRetints()
 {
+    QFETCH(QByteArray, image);
     QVERIFY(ConfigFixture::write(ThemeKeys + QLatin1String("primary_color"), QStringLiteral("'#ffffff'")));
     QTRY_COMPARE(Pelkan::Theme::instance()->primaryColor(), QColor(Qt::white));
     QQuickView view;
     view.engine()->addImageProvider(QStringLiteral("theme"), new DeclarativeImageProvider);
     view.setColor(Qt::black);
-    QQuickItem *root = showScene(view, "import QtQuick 2.6\n"
-                                   "Item { width: 100; height: 100\n"
-                                   "  Image { x: 10; y: 10; width: 32; height: 32; source: 'image://theme/icon-themed' } }\n");
-    QVERIFY(root);
+    QVERIFY(showScene(view, "import QtQuick 2.6\nItem { width: 100; height: 100\n  " + image + " }\n"));
     QImage grab;
     QTRY_VERIFY((grab = view.grabWindow(), near(grab.pixel(26, 26), Qt::white)));
 
@@ -180,6 +199,108 @@ void tst_DeclarativeImageProvider::themeColourChangeRetints()
     QVERIFY(ConfigFixture::write(ThemeKeys + QLatin1String("primary_color"), QStringLiteral("'#ff8000'")));
     QTRY_VERIFY2((grab = view.grabWindow(), near(grab.pixel(26, 26), QColor(0xff, 0x80, 0x00))),
                  qPrintable(QColor(grab.pixel(26, 26)).name()));
+}
+
+void tst_DeclarativeImageProvider::themeKeysReachNewRequests_data()
+{
+    QTest::addColumn<QString>("key");
+    QTest::addColumn<QString>("name");
+    QTest::addColumn<QSize>("before"); // invalid: not found
+    QTest::addColumn<QSize>("after");
+    QTest::newRow("directory") << "directory" << "icon-elsewhere" << QSize() << QSize(10, 10);
+    QTest::newRow("pixel_ratio") << "pixel_ratio" << "icon-ratio" << QSize(34, 34) << QSize(66, 66);
+}
+
+void tst_DeclarativeImageProvider::themeKeysReachNewRequests()
+{
+    QFETCH(QString, key);
+    QFETCH(QString, name);
+    QFETCH(QSize, before);
+    QFETCH(QSize, after);
+    QTemporaryDir other;
+    QDir().mkpath(other.filePath(QStringLiteral("icons")));
+    QImage small(8, 8, QImage::Format_ARGB32);
+    small.fill(Qt::black);
+    QVERIFY(small.save(other.filePath(QStringLiteral("icons/icon-elsewhere.png"))));
+    QDir().mkpath(m_theme.filePath(QStringLiteral("icons/z2.0")));
+    writeIcon(QStringLiteral("icon-ratio"), QSize(32, 32), false);
+    writeIcon(QStringLiteral("z2.0/icon-ratio"), QSize(64, 64), false);
+
+    DeclarativeImageProvider provider; // made before the change, as an engine's is
+    auto sizeOf = [&provider, &name] {
+        QSize size;
+        QScopedPointer<QQuickTextureFactory> factory(provider.requestTexture(name, &size, QSize()));
+        return factory ? size : QSize();
+    };
+    QCOMPARE(sizeOf(), before);
+    const QString value = key == QLatin1String("directory") ? QLatin1Char('\'') + other.path() + QLatin1Char('\'')
+                                                             : QStringLiteral("2.0");
+    QVERIFY(ConfigFixture::write(ThemeKeys + key, value));
+    QTRY_COMPARE(sizeOf(), after);
+
+    QVERIFY(ConfigFixture::write(ThemeKeys + QLatin1String("directory"), QLatin1Char('\'') + m_theme.path() + QLatin1Char('\'')));
+    QVERIFY(ConfigFixture::write(ThemeKeys + QLatin1String("pixel_ratio"), QStringLiteral("1.0")));
+    QTRY_COMPARE(Pelkan::Theme::instance()->themeDirectory(), m_theme.path());
+    QTRY_COMPARE(Pelkan::Theme::instance()->pixelRatio(), 1.0);
+}
+
+void tst_DeclarativeImageProvider::missingIconReportedOnce()
+{
+    static QStringList warnings;
+    warnings.clear();
+    QtMessageHandler previous = qInstallMessageHandler([](QtMsgType type, const QMessageLogContext &, const QString &text) {
+        if (type == QtWarningMsg)
+            warnings << text;
+    });
+    DeclarativeImageProvider provider;
+    for (int i = 0; i < 3; ++i) {
+        QSize size;
+        QVERIFY(!provider.requestTexture(QStringLiteral("icon-nowhere?#ff0000"), &size, QSize()));
+    }
+    qInstallMessageHandler(previous);
+    QCOMPARE(warnings.size(), 1); // and nothing from a reader opened on no file
+    QVERIFY2(warnings.first().contains(QLatin1String("\"icon-nowhere\""))
+                     && warnings.first().contains(m_theme.path() + QLatin1String("/icons/z1.0"))
+                     && warnings.first().contains(m_theme.path() + QLatin1String("/graphics")),
+             qPrintable(warnings.first()));
+}
+
+// Windows opened and closed while another stays: what they drew with goes with their
+// GL context (each window's own in the threaded loop; in the basic loop one shared by all,
+// which stays with the window that stays), and a later colour change reaches only
+// windows that exist.
+void tst_DeclarativeImageProvider::windowsComeAndGo()
+{
+    const QByteArray scene = "import QtQuick 2.6\nimport Quorvane.Pelkan.private 1.0\n"
+                             "Item { width: 100; height: 60\n"
+                             "  Image { id: icon; x: 10; y: 10; width: 32; height: 32; source: 'image://theme/icon-themed' }\n"
+                             "  BlurEffect { x: 50; width: 40; height: 40; sourceItem: icon } }\n";
+    auto show = [&scene](QQuickView &view) {
+        view.engine()->addImageProvider(QStringLiteral("theme"), new DeclarativeImageProvider);
+        view.setColor(Qt::black);
+        QVERIFY(showScene(view, scene));
+        QTRY_VERIFY(near(view.grabWindow().pixel(26, 26), Pelkan::Theme::instance()->primaryColor()));
+    };
+    const int atlases = DeclarativeImageProvider::atlasCount();
+    const int caches = BlurEffectCache::cacheCount();
+    // The staying window opens after the first passing one, which drew the icon first.
+    QScopedPointer<QQuickView> staying;
+    for (int i = 0; i < 12; ++i) {
+        QQuickView passing;
+        show(passing);
+        if (!staying) {
+            staying.reset(new QQuickView);
+            show(*staying);
+        }
+        passing.close();
+    }
+    QCOMPARE(DeclarativeImageProvider::atlasCount(), atlases + 1);
+    QCOMPARE(BlurEffectCache::cacheCount(), caches + 1);
+
+    for (const char *colour : { "'#00ff00'", "'#0000ff'" }) {
+        QVERIFY(ConfigFixture::write(ThemeKeys + QLatin1String("primary_color"), QString::fromLatin1(colour)));
+        QTRY_VERIFY(near(staying->grabWindow().pixel(26, 26), QColor(QString::fromLatin1(colour).remove(QLatin1Char('\'')))));
+    }
 }
 
 QTEST_MAIN(tst_DeclarativeImageProvider)
