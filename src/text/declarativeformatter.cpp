@@ -36,22 +36,48 @@ QString translated(const QByteArray &id, int n = -1)
     return text.isEmpty() || text == QLatin1String(id) ? QString() : text;
 }
 
-// Fills the lowest placeholder when the text has one; an untranslated id has none. A text
-// whose only '%' is the placeholder is spliced directly, which is what arg() would do.
-QString fill(const QString &text, const QString &value, int placeholder = 1)
+// The number of the placeholder at text[at] ('%' followed by one or two digits, or by 'L'
+// and the digits, as QString::arg reads them), or 0; length receives its length.
+int placeholderAt(const QString &text, int at, int *length)
 {
-    const QChar digit(ushort('0' + placeholder));
-    const int at = text.indexOf(QLatin1Char('%'));
-    if (at < 0)
-        return text;
-    if (at + 1 < text.size() && text.at(at + 1) == digit && text.indexOf(QLatin1Char('%'), at + 1) < 0
-            && (at + 2 >= text.size() || !text.at(at + 2).isDigit())) {
-        QString result;
-        result.reserve(text.size() + value.size() - 2);
-        result.append(text.constData(), at).append(value).append(text.constData() + at + 2, text.size() - at - 2);
-        return result;
+    int i = at + 1;
+    if (i < text.size() && text.at(i) == QLatin1Char('L'))
+        ++i;
+    int number = 0;
+    const int first = i;
+    while (i < text.size() && i - first < 2 && text.at(i).isDigit() && text.at(i).unicode() < 128) {
+        number = number * 10 + (text.at(i).unicode() - '0');
+        ++i;
     }
-    return text.contains(QLatin1Char('%') + QString::number(placeholder)) ? text.arg(value) : text;
+    *length = i - at;
+    return number;
+}
+
+// Fills the lowest-numbered placeholder, every occurrence of it, as QString::arg does with
+// a text ("%1", "%L1", or "%2" when that is the lowest a translator wrote); a text with
+// none (an untranslated id) comes back unchanged, without arg()'s warning.
+QString fill(const QString &text, const QString &value)
+{
+    int lowest = 100;
+    int length = 0;
+    for (int at = text.indexOf(QLatin1Char('%')); at >= 0; at = text.indexOf(QLatin1Char('%'), at + 1)) {
+        const int number = placeholderAt(text, at, &length);
+        if (number > 0 && number < lowest)
+            lowest = number;
+    }
+    if (lowest == 100)
+        return text;
+    QString result;
+    result.reserve(text.size() + value.size());
+    int copied = 0;
+    for (int at = text.indexOf(QLatin1Char('%')); at >= 0; at = text.indexOf(QLatin1Char('%'), at + 1)) {
+        if (placeholderAt(text, at, &length) != lowest)
+            continue;
+        result.append(text.constData() + copied, at - copied).append(value);
+        copied = at + length;
+        at = copied - 1;
+    }
+    return result.append(text.constData() + copied, text.size() - copied);
 }
 
 QString capitaliseFirst(QString text)
@@ -207,11 +233,11 @@ QString DeclarativeFormatter::monthName(const QDate &date, bool capitalised) con
 
 QString DeclarativeFormatter::shortDateWithoutYear(const QDate &date) const
 {
-    QString text = fill(qtTrId("quorvanepelkan-formatShortDate"), s_formattingLocale.toString(date, QStringLiteral("d")));
-    if (text.contains(QLatin1String("%2")))
-        return text.arg(s_formattingLocale.toString(date, QStringLiteral("M")));
-    text.replace(QLatin1String("%3"), QLatin1String("%2"));
-    return fill(text, s_formattingLocale.toString(date, QStringLiteral("MMM")), 2);
+    // The day, then the month as a number (%2) or as a short name (%3).
+    const QString text = fill(qtTrId("quorvanepelkan-formatShortDate"), s_formattingLocale.toString(date, QStringLiteral("d")));
+    if (text.contains(QLatin1String("%2")) || text.contains(QLatin1String("%L2")))
+        return fill(text, s_formattingLocale.toString(date, QStringLiteral("M")));
+    return fill(text, s_formattingLocale.toString(date, QStringLiteral("MMM")));
 }
 
 QString DeclarativeFormatter::yearOrShortDate(const QDate &date, const QDate &today) const
@@ -233,7 +259,7 @@ QString DeclarativeFormatter::sectionRelative(qint64 difference, const QDate &da
 
 QString DeclarativeFormatter::timepoint(const QString &time, const QString &dateOrDay) const
 {
-    return fill(fill(qtTrId("quorvanepelkan-formatTimepoint"), time), dateOrDay, 2);
+    return fill(fill(qtTrId("quorvanepelkan-formatTimepoint"), time), dateOrDay);
 }
 
 QString DeclarativeFormatter::timeValue(const QTime &time, bool twelveHours) const

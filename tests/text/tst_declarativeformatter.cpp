@@ -295,6 +295,13 @@ void tst_DeclarativeFormatter::translatedPatterns_data()
     QTest::newRow("digit after the hours, quoted text") << duration << "h9 'min' mm" << 3660LL << "19 min 01";
     QTest::newRow("padded hours and a digit") << duration << "hh0'h'" << 3600LL << "010h";
     QTest::newRow("an h inside quotes stays") << duration << "h 'hours'" << 7200LL << "2 hours";
+    // Placeholders are filled as QString::arg fills them.
+    const QByteArray kilobytes("quorvanepelkan-kilobytes");
+    QTest::newRow("localised placeholder") << kilobytes << "%L1 kB" << 2048LL << "2.0 kB";
+    QTest::newRow("lowest placeholder is not %1") << kilobytes << "%2 kB" << 2048LL << "2.0 kB";
+    QTest::newRow("placeholder twice") << kilobytes << "%1 kB (%1)" << 2048LL << "2.0 kB (2.0)";
+    QTest::newRow("a percent that is no placeholder") << kilobytes << "100% %1 kB" << 2048LL << "100% 2.0 kB";
+    QTest::newRow("no placeholder") << kilobytes << "kB" << 2048LL << "kB";
 }
 
 void tst_DeclarativeFormatter::translatedPatterns()
