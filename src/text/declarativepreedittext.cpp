@@ -29,10 +29,14 @@ void DeclarativePreeditText::setEditor(QObject *editor)
     if (m_editor)
         disconnect(m_editor, nullptr, this, nullptr);
     m_editor = editor;
-    if (editor) {
+    if (!editor)
+        return;
+    // Any object may be the parent; only what it has is followed, silently.
+    const QMetaObject *meta = editor->metaObject();
+    if (meta->indexOfSignal("activeFocusChanged(bool)") >= 0)
         connect(editor, SIGNAL(activeFocusChanged(bool)), this, SLOT(handleFocusChanged(bool)));
+    if (meta->indexOfSignal("textChanged()") >= 0)
         connect(editor, SIGNAL(textChanged()), this, SIGNAL(textChanged()));
-    }
 }
 
 void DeclarativePreeditText::handleFocusChanged(bool focus)

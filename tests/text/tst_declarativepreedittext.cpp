@@ -18,6 +18,8 @@ private Q_SLOTS:
     void writingCommitsFirst();
     void writingTheSameTextKeepsTheComposition();
     void withoutEditor();
+    void parentThatIsNoEditor_data();
+    void parentThatIsNoEditor();
 
 private:
     QQmlEngine m_engine;
@@ -93,6 +95,35 @@ void tst_DeclarativePreeditText::withoutEditor()
     QTest::ignoreMessage(QtInfoMsg, QRegularExpression(QStringLiteral("setting text property without target editor")));
     loose.setText(QStringLiteral("x"));
     QCOMPARE(loose.text(), QString());
+}
+
+void tst_DeclarativePreeditText::parentThatIsNoEditor_data()
+{
+    QTest::addColumn<QByteArray>("parent");
+    QTest::addColumn<QString>("text");
+    QTest::newRow("an item without text") << QByteArray("Item {") << QString();
+    QTest::newRow("an object with text but no focus") << QByteArray("QtObject { property string text: 'abc';") << "abc";
+}
+
+// Placed where there is no editor, it reads what it can and says nothing.
+void tst_DeclarativePreeditText::parentThatIsNoEditor()
+{
+    QFETCH(QByteArray, parent);
+    QFETCH(QString, text);
+    static int messages;
+    messages = 0;
+    QtMessageHandler previous = qInstallMessageHandler([](QtMsgType type, const QMessageLogContext &, const QString &) {
+        if (type != QtDebugMsg)
+            ++messages;
+    });
+    QQmlComponent component(&m_engine);
+    component.setData("import QtQuick 2.6\nimport Quorvane.Pelkan.private 1.0\n" + parent
+                              + " property PreeditText preedit: PreeditText {} }\n", QUrl());
+    QScopedPointer<QObject> object(component.create());
+    qInstallMessageHandler(previous);
+    QVERIFY2(object, qPrintable(component.errorString()));
+    QCOMPARE(messages, 0);
+    QCOMPARE(object->property("preedit").value<DeclarativePreeditText *>()->text(), text);
 }
 
 QTEST_MAIN(tst_DeclarativePreeditText)
