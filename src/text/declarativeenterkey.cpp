@@ -2,6 +2,8 @@
 #include "inputmethodextensions.h"
 
 #include <QKeyEvent>
+#include <QMetaType>
+#include <qqml.h>
 
 namespace {
 const QString IconKey = QStringLiteral("enterKeyIconSource");
@@ -86,6 +88,32 @@ void DeclarativeEnterKey::setHighlighted(bool highlighted)
     if (highlighted == this->highlighted())
         return;
     InputMethodExtensions::setValue(m_editor, HighlightedKey, highlighted);
+}
+
+QObject *DeclarativeEnterKey::quickEnterKey() const
+{
+    if (!m_editor)
+        return nullptr;
+    // QtQuick's attached type, known by name once QtQuick has registered its types.
+    const int id = QMetaType::type("QQuickEnterKeyAttached*");
+    const QMetaObject *meta = id != QMetaType::UnknownType ? QMetaType::metaObjectForType(id) : nullptr;
+    QQmlAttachedPropertiesFunc attach = meta ? qmlAttachedPropertiesFunction(m_editor, meta) : nullptr;
+    return attach ? qmlAttachedPropertiesObject(m_editor, attach, true) : nullptr;
+}
+
+int DeclarativeEnterKey::type() const
+{
+    const QObject *quick = quickEnterKey();
+    return quick ? quick->property("type").toInt() : int(Qt::EnterKeyDefault);
+}
+
+void DeclarativeEnterKey::setType(int type)
+{
+    QObject *quick = quickEnterKey();
+    if (!quick || type == this->type())
+        return;
+    quick->setProperty("type", type);
+    Q_EMIT typeChanged();
 }
 
 void DeclarativeEnterKey::updateKeyFilter()

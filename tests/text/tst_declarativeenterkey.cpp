@@ -19,6 +19,7 @@ private Q_SLOTS:
     void returnReleaseClicks_data();
     void returnReleaseClicks();
     void focusedFieldUpdatesTheKeyboard();
+    void oneGroupServesQtQuicksToo();
 
 private:
     QQuickItem *load(const QByteArray &body);
@@ -167,6 +168,23 @@ void tst_DeclarativeEnterKey::focusedFieldUpdatesTheKeyboard()
     updates = context->property("platformDataUpdates").toInt();
     key.setText(QStringLiteral("Done"));
     QVERIFY(context->property("platformDataUpdates").toInt() > updates);
+}
+
+// Imported after QtQuick 2.6, which has an EnterKey of its own: text and type bind in one
+// group, and the type reaches the keyboard through QtQuick's attached object.
+void tst_DeclarativeEnterKey::oneGroupServesQtQuicksToo()
+{
+    QQuickItem *root = load("TextInput { EnterKey.text: 'Go'; EnterKey.type: Qt.EnterKeySend }");
+    QVERIFY(root);
+    QCOMPARE(root->inputMethodQuery(Qt::ImEnterKeyType).toInt(), int(Qt::EnterKeySend));
+    QCOMPARE(root->property("__inputMethodExtensions").toMap().value(QStringLiteral("enterKeyText")), QVariant(QStringLiteral("Go")));
+    auto key = qobject_cast<DeclarativeEnterKey *>(qmlAttachedPropertiesObject<DeclarativeEnterKey>(root, false));
+    QVERIFY(key);
+    QSignalSpy changed(key, &DeclarativeEnterKey::typeChanged);
+    key->setType(Qt::EnterKeyDone);
+    key->setType(Qt::EnterKeyDone);
+    QCOMPARE(root->inputMethodQuery(Qt::ImEnterKeyType).toInt(), int(Qt::EnterKeyDone));
+    QCOMPARE(changed.count(), 1);
 }
 
 QTEST_MAIN(tst_DeclarativeEnterKey)

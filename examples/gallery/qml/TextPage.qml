@@ -10,6 +10,10 @@ Column {
     topPadding: Theme.paddingLarge
 
     property string sent
+    // Read back through these: in script, `EnterKey` names QtQuick's attached type (the
+    // first import), while bindings reach this toolkit's (the last import).
+    readonly property string enterText: field.text.length > 0 ? "Send" : ""
+    readonly property bool enterEnabled: field.text.length > 0
 
     Rectangle {
         x: Theme.horizontalPageMargin
@@ -27,9 +31,10 @@ Column {
             font.pixelSize: Theme.fontSizeMedium
             focus: true
 
-            EnterKey.text: field.text.length > 0 ? "Send" : ""
+            EnterKey.text: page.enterText
+            EnterKey.type: Qt.EnterKeySend
             EnterKey.iconSource: "image://theme/icon-m-forward"
-            EnterKey.enabled: field.text.length > 0
+            EnterKey.enabled: page.enterEnabled
             EnterKey.onClicked: {
                 autoFill.insert(field.text)
                 autoFill.save()
@@ -57,7 +62,7 @@ Column {
         x: Theme.horizontalPageMargin
         color: Theme.secondaryColor
         font.pixelSize: Theme.fontSizeSmall
-        text: "Enter key: " + (field.EnterKey.text || "(default)") + (field.EnterKey.enabled ? "" : ", disabled")
+        text: "Enter key: " + (page.enterText || "(default)") + (page.enterEnabled ? "" : ", disabled")
               + "\nWith composition: " + preedit.text
               + (page.sent ? "\nSent: " + page.sent : "")
     }
