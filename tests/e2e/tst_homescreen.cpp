@@ -118,6 +118,10 @@ void tst_HomeScreen::coverWindowPairsWithApplication()
     QVERIFY(run(session, { QStringLiteral("category=%1").arg(category ? "true" : "false") }));
 
     const int application = session.surfaceWith(QStringLiteral("BACKGROUND_VISIBLE"));
+    // The cover's properties arrive together, but not necessarily with its category.
+    QVERIFY(!session.waitFor([](const QJsonObject &r) {
+        return r.value(QLatin1String("event")) == QLatin1String("property") && name(r) == QLatin1String("TRANSPARENT");
+    }).isEmpty());
     const int cover = session.surfaceWith(QStringLiteral("TRANSPARENT"));
     QVERIFY(cover != 0 && cover != application);
 

@@ -3,13 +3,15 @@
 #include <QObject>
 
 // Screen orientations as single bits, so that they combine into masks: the same values
-// serve as the Orientations flags of the window's allowed-orientation properties.
+// serve as the Orientations flags of the window's allowed-orientation properties. The
+// underlying type is fixed so that any int QML writes is a value of the type, which the
+// setters then refuse or keep.
 class DeclarativeOrientation : public QObject
 {
     Q_OBJECT
 
 public:
-    enum Orientation {
+    enum Orientation : int {
         None = 0,
         Portrait = 1,
         Landscape = 2,
