@@ -164,6 +164,7 @@ private Q_SLOTS:
 
 private:
     void readConfiguration();
+    void followPrimaryScreen();
     void updateOrientation();
     void enterWindow(QQuickWindow *window);
     void trackScreen(QScreen *screen);
