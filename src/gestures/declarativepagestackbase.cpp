@@ -1,4 +1,5 @@
 #include "declarativepagestackbase.h"
+#include "declarativedragfilter.h"
 #include "pelkanlogging.h"
 #include "windowpropertypublisher.h"
 
@@ -96,6 +97,7 @@ void DeclarativePageStackBase::setNoGrabbing(bool noGrabbing)
 void DeclarativePageStackBase::mousePressEvent(QMouseEvent *event)
 {
     // A press is never taken: the page's content gets it, and the swipe is stolen later.
+    m_claimedByChild = {};
     handleMouse(event);
     event->ignore();
 }
@@ -115,10 +117,13 @@ void DeclarativePageStackBase::mouseUngrabEvent()
     reset();
 }
 
-bool DeclarativePageStackBase::childMouseEventFilter(QQuickItem *, QEvent *event)
+bool DeclarativePageStackBase::childMouseEventFilter(QQuickItem *item, QEvent *event)
 {
     switch (event->type()) {
     case QEvent::MouseButtonPress:
+        // A drag the item under the finger claims for itself is not a swipe.
+        m_claimedByChild = DeclarativeDragFilter::claimed(item, this);
+        return handleMouse(static_cast<QMouseEvent *>(event));
     case QEvent::MouseButtonRelease:
     case QEvent::MouseMove:
         return handleMouse(static_cast<QMouseEvent *>(event));
@@ -201,6 +206,8 @@ bool DeclarativePageStackBase::handleMove(QPointF pos)
         if (!m_mouseGrabbed && !m_noGrabbing)
             _grabMouse();
     } else {
+        if (m_claimedByChild & (vertical ? Qt::Vertical : Qt::Horizontal))
+            return false;
         const int threshold = int(QGuiApplication::styleHints()->startDragDistance() * 1.5);
         const qreal dx = pos.x() - m_pressPosition.x();
         const qreal dy = pos.y() - m_pressPosition.y();

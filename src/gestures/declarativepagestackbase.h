@@ -128,6 +128,7 @@ private:
     QPointF m_pressPosition;
     QPointF m_pressWindowPosition;
     ulong m_pressTimestamp = 0;
+    Qt::Orientations m_claimedByChild; // by a DragFilter under the press
     QPointer<QQuickItem> m_currentContainer;
     QPointer<QQuickItem> m_currentPage;
     QHash<QString, QString> m_importCache;

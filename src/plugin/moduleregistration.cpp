@@ -9,14 +9,17 @@
 #include "declarativecoveraction.h"
 #include "declarativecoveractionlist.h"
 #include "declarativecoverwindow.h"
+#include "declarativedragfilter.h"
 #include "declarativeenterkey.h"
 #include "declarativeformatter.h"
 #include "declarativeglassitem.h"
 #include "declarativepreedittext.h"
 #include "declarativepagestackbase.h"
 #include "declarativestandardpaths.h"
+#include "declarativetouchblocker.h"
 #include "declarativewindow.h"
 #include "formattingproxymodel.h"
+#include "minversemousearea.h"
 #include "pulleymenulogic.h"
 #include "palette.h"
 #include "screen.h"
@@ -89,10 +92,12 @@ void registerPublicModule(const char *uri)
     qmlRegisterType<DeclarativePageStackBase>(uri, 1, 0, "PageStackBase");
     qmlRegisterType<DeclarativeBounceEffect>(uri, 1, 0, "BounceEffect");
     qmlRegisterType<DeclarativeGlassItem>(uri, 1, 0, "GlassItem");
+    qmlRegisterType<MInverseMouseArea>(uri, 1, 0, "InverseMouseArea");
     qmlRegisterType<DeclarativeCoverAction>(uri, 1, 0, "CoverAction");
     qmlRegisterType<DeclarativeCoverActionList>(uri, 1, 0, "CoverActionList");
     qmlRegisterType<DeclarativeFormatter>(uri, 1, 0, "Formatter");
     qmlRegisterType<DeclarativeCover>(uri, 1, 0, "Cover");
+    qmlRegisterType<DeclarativeTouchBlocker>(uri, 1, 0, "TouchBlocker");
     qmlRegisterAnonymousType<QAbstractItemModel>(uri, 1);
     qmlRegisterType<FormattingProxyModel>(uri, 1, 0, "FormattingProxyModel");
     qmlRegisterType<Pelkan::Palette>(uri, 1, 0, "Palette");
@@ -106,6 +111,7 @@ void registerPrivateModule(const char *uri)
     qmlRegisterRevision<QQuickWindow, 1>(uri, 1, 0);
     qmlRegisterType<DeclarativeWindow>(uri, 1, 0, "Window");
     qmlRegisterType<DeclarativeCoverWindow>(uri, 1, 0, "CoverWindow");
+    registerUncreatable<DeclarativeDragFilter>(uri, "DragFilter");
     qmlRegisterType<DeclarativePreeditText>(uri, 1, 0, "PreeditText");
     qmlRegisterType<PulleyMenuLogic>(uri, 1, 0, "PulleyMenuLogic");
     qmlRegisterType<BlurEffect>(uri, 1, 0, "BlurEffect");
