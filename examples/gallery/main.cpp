@@ -1,8 +1,8 @@
-// The gallery: every component of the toolkit on one page per subject.
+// The gallery: an application built from the toolkit's components, one page per subject.
 //
 //   pelkan-gallery                       opens the gallery in a window
 //   pelkan-gallery --screenshot out.png  renders it once and saves a picture
-//   pelkan-gallery --page orientation    opens on another page
+//   pelkan-gallery --page orientation    opens on a subject over the home page
 
 #include "screenshotter.h"
 
@@ -10,11 +10,14 @@
 #include <QDir>
 #include <QGuiApplication>
 #include <QQmlApplicationEngine>
+#include <QQuickItem>
 #include <QQuickWindow>
 #include <QTranslator>
 
 int main(int argc, char *argv[])
 {
+    // The cover window is drawn over the home screen: windows need an alpha channel.
+    QQuickWindow::setDefaultAlphaBuffer(true);
     QGuiApplication app(argc, argv);
     app.setApplicationName(QStringLiteral("pelkan-gallery"));
 
@@ -25,8 +28,9 @@ int main(int argc, char *argv[])
                                         QStringLiteral("Render once, save a PNG to <file> and quit."),
                                         QStringLiteral("file"));
     parser.addOption(screenshot);
-    const QCommandLineOption page(QStringLiteral("page"), QStringLiteral("Open on <page>: theme, images, orientation, format, gestures, cover, text."),
-                                  QStringLiteral("page"), QStringLiteral("theme"));
+    const QCommandLineOption page(QStringLiteral("page"),
+                                  QStringLiteral("Open on <page>: home, theme, images, orientation, format, gestures, cover, text, dialog."),
+                                  QStringLiteral("page"), QStringLiteral("home"));
     parser.addOption(page);
     parser.process(app);
 
@@ -44,9 +48,11 @@ int main(int argc, char *argv[])
             QCoreApplication::installTranslator(&localised);
     }
 
-    engine.setInitialProperties({ { QStringLiteral("initialPage"), parser.value(page) } });
+    engine.setInitialProperties({ { QStringLiteral("startPage"), parser.value(page) } });
     engine.load(QUrl(QStringLiteral("qrc:/gallery/main.qml")));
-    auto window = engine.rootObjects().isEmpty() ? nullptr : qobject_cast<QQuickWindow *>(engine.rootObjects().first());
+    // The application window makes the window it lives in.
+    auto root = engine.rootObjects().isEmpty() ? nullptr : qobject_cast<QQuickItem *>(engine.rootObjects().first());
+    QQuickWindow *window = root ? root->window() : nullptr;
     if (!window)
         return 1;
 

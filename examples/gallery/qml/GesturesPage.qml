@@ -17,6 +17,8 @@ Item {
         width: parent.width
         height: parent.height * 0.42
         clip: true
+        // Sideways drags here belong to this small stack, not to the application's.
+        Private.DragFilter.orientations: Qt.Horizontal
         depth: index + 1
         forwardNavigation: index < colours.length - 1
         backNavigation: index > 0

@@ -60,12 +60,12 @@ Flickable {
             ToggleRow {
                 width: column.width
                 text: page.names[modelData]
-                checked: applicationWindow && (applicationWindow._allowedOrientations & modelData)
+                checked: applicationWindow && (applicationWindow.allowedOrientations & modelData)
                 onToggled: {
-                    var allowed = applicationWindow._allowedOrientations ^ modelData
+                    var allowed = applicationWindow.allowedOrientations ^ modelData
                     // The window refuses an empty set; keep the last one ticked.
                     if (allowed !== 0)
-                        applicationWindow._allowedOrientations = allowed
+                        applicationWindow.allowedOrientations = allowed
                 }
             }
         }

@@ -1,62 +1,33 @@
 import QtQuick 2.6
-import QtQuick.Window 2.2
 import Quorvane.Pelkan 1.0
-import Quorvane.Pelkan.private 1.0 as Private
 
-Window {
-    id: window
+// The gallery: an application built from the toolkit's components. The home page lists
+// the subjects; each opens on a page of its own, swiped back to the home page or left with
+// the Back key. A page about the gallery is attached to the right of the home page.
+ApplicationWindow {
+    id: app
 
-    // Which page the gallery opens on: theme, images, orientation, format, gestures, cover, text.
-    property string initialPage: "theme"
+    // Which subject the gallery opens on, over the home page: theme, images, orientation,
+    // format, gestures, cover, text, dialog; "home" for none.
+    property string startPage: "home"
+    property int played: 0
+    property int skipped: 0
 
-    visible: true
-    // A phone-shaped window in the display's portrait pixels.
-    width: Math.min(screen.width, Screen.width)
-    height: Math.min(screen.height, Screen.height)
-    title: "Quorvane Pelkan gallery"
-    color: Theme.colorScheme === Theme.LightOnDark ? "#10141c" : "#f4f6fa"
-
-    Private.Window {
-        id: applicationWindow
-        anchors.fill: parent
-
-        Row {
-            id: tabs
-            property string current: window.initialPage
-            width: parent.width
-            height: Theme.itemSizeSmall
-
-            Repeater {
-                model: [{ name: "theme", title: "Theme" }, { name: "images", title: "Images" },
-                        { name: "orientation", title: "Orient." },
-                        { name: "format", title: "Format" }, { name: "gestures", title: "Gestures" },
-                        { name: "cover", title: "Cover" }, { name: "text", title: "Text" }]
-                Item {
-                    width: tabs.width / 7
-                    height: tabs.height
-                    Text {
-                        anchors.centerIn: parent
-                        text: modelData.title
-                        color: tabs.current === modelData.name ? Theme.highlightColor : Theme.secondaryColor
-                        font.pixelSize: Theme.fontSizeSmall * 0.85
-                    }
-                    MouseArea {
-                        anchors.fill: parent
-                        onClicked: tabs.current = modelData.name
-                    }
-                }
-            }
+    initialPage: Component { HomePage {} }
+    cover: Component {
+        GalleryCover {
+            played: app.played
+            skipped: app.skipped
+            onPlayPressed: app.played++
+            onNextPressed: app.skipped++
         }
+    }
 
-        Loader {
-            anchors { top: tabs.bottom; left: parent.left; right: parent.right; bottom: parent.bottom }
-            source: tabs.current === "orientation" ? "OrientationPage.qml"
-                  : tabs.current === "format" ? "FormatPage.qml"
-                  : tabs.current === "gestures" ? "GesturesPage.qml"
-                  : tabs.current === "cover" ? "CoverPage.qml"
-                  : tabs.current === "text" ? "TextPage.qml"
-                  : tabs.current === "images" ? "ImagesPage.qml" : "ThemePage.qml"
-            onLoaded: if (item.hasOwnProperty("applicationWindow")) item.applicationWindow = applicationWindow
-        }
+    Component.onCompleted: {
+        if (startPage === "dialog")
+            pageStack.currentPage.openDialog(PageStackAction.Immediate)
+        else if (startPage !== "home")
+            pageStack.push(Qt.resolvedUrl("SubjectPage.qml"), { "name": startPage, "application": app },
+                           PageStackAction.Immediate)
     }
 }
