@@ -30,7 +30,7 @@ Item {
         onClicked: if (header.dialog) header.dialog.reject()
 
         Text {
-            anchors { left: parent.left; leftMargin: Theme.horizontalPageMargin; verticalCenter: parent.verticalCenter }
+            anchors { left: cancelButton.left; leftMargin: Theme.horizontalPageMargin; verticalCenter: cancelButton.verticalCenter }
             text: header.cancelText
             color: cancelButton.pressed ? Theme.highlightColor : Theme.primaryColor
             font.pixelSize: Theme.fontSizeLarge
@@ -47,7 +47,7 @@ Item {
         onClicked: if (header.dialog) header.dialog.accept()
 
         Text {
-            anchors { right: parent.right; rightMargin: Theme.horizontalPageMargin; verticalCenter: parent.verticalCenter }
+            anchors { right: acceptButton.right; rightMargin: Theme.horizontalPageMargin; verticalCenter: acceptButton.verticalCenter }
             text: header.acceptText
             color: acceptButton.pressed ? Theme.highlightColor : Theme.primaryColor
             opacity: acceptButton.enabled ? 1 : 0.4
@@ -57,7 +57,7 @@ Item {
 
     Text {
         id: titleLabel
-        anchors { top: acceptButton.bottom; right: parent.right; rightMargin: Theme.horizontalPageMargin }
+        anchors { top: acceptButton.bottom; right: header.right; rightMargin: Theme.horizontalPageMargin }
         visible: header.title.length > 0
         text: header.title
         color: Theme.highlightColor

@@ -29,10 +29,16 @@ Item {
     height: parent ? parent.height : 0
     focus: status === PageStatus.Active
 
-    Rectangle {
+    // Takes presses nothing on the page takes, so that a swipe starts anywhere on it and
+    // nothing below the page reacts.
+    MouseArea {
         anchors.fill: parent
-        color: page.backgroundColor
-        visible: page.backgroundColor.a > 0
         z: -1
+
+        Rectangle {
+            anchors.fill: parent
+            color: page.backgroundColor
+            visible: page.backgroundColor.a > 0
+        }
     }
 }

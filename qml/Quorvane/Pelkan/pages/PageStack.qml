@@ -25,6 +25,8 @@ PageStackBase {
     readonly property real _extent: horizontalNavigationStyle ? width : height
     property Item _window: null
     property double _pressTime: 0
+    // The clock gestures are timed by, in milliseconds; tests give their own.
+    property var _now: function() { return Date.now() }
     property var _afterTransition: null
 
     focus: true
@@ -257,7 +259,7 @@ PageStackBase {
         currentPage = top ? top.page : null
     }
 
-    onPressed: _pressTime = Date.now()
+    onPressed: _pressTime = _now()
     onReleased: {
         // Where the finger let go becomes where the pages rest, then they move on.
         var back = horizontalNavigationStyle ? _leftFlickDifference : _upFlickDifference
@@ -265,8 +267,9 @@ PageStackBase {
         var moved = back > 0 ? back : forward
         if (moved <= 0)
             return
-        var elapsed = Math.max(1, Date.now() - _pressTime)
-        var complete = moved > _extent / 2 || (moved / elapsed > 0.5 && moved > Theme.paddingLarge)
+        // Past half the way, or a quick flick: a pixel per millisecond at the theme's scale.
+        var elapsed = Math.max(1, _now() - _pressTime)
+        var complete = moved > _extent / 2 || (moved / elapsed > Theme.pixelRatio && moved > Theme.paddingLarge)
         _settle = back > 0 ? back : -forward
         if (!complete)
             _animate(0, function() {}, PageStackAction.Animated)
