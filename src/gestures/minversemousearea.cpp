@@ -103,10 +103,10 @@ bool MInverseMouseArea::eventFilter(QObject *watched, QEvent *event)
         for (const QTouchEvent::TouchPoint &point : static_cast<QTouchEvent *>(event)->touchPoints()) {
             if (m_touchId < 0 && point.state() == Qt::TouchPointPressed) {
                 m_touchId = point.id();
-                press(point.scenePos());
+                press(point.pos()); // window coordinates, the scene's
             } else if (point.id() == m_touchId && point.state() == Qt::TouchPointReleased) {
                 m_touchId = -1;
-                release(point.scenePos());
+                release(point.pos());
             }
         }
         break;

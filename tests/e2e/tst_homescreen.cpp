@@ -28,6 +28,7 @@ private Q_SLOTS:
     void coverStatusFromHomeScreen();
     void backKey_data();
     void backKey();
+    void backKeyThroughThePageStack();
     void leavesNoProcessBehind();
 
 private:
@@ -277,6 +278,30 @@ void tst_HomeScreen::backKey()
         QCOMPARE(session.waitForEvent(QStringLiteral("lower")).value(QLatin1String("surface")).toInt(), application);
         QCOMPARE(session.log().count(QLatin1String("e2e: pop")), 1);
     }
+}
+
+// The components on the device: the Back key pops the top page with its statuses in
+// order, then, with one page left, lowers the window.
+void tst_HomeScreen::backKeyThroughThePageStack()
+{
+    HomeScreenSession session;
+    QVERIFY(session.start(QFINDTESTDATA("data/pages.qml"), {}));
+    QVERIFY(session.waitForLog(QStringLiteral("e2e: second page active")));
+    QVERIFY(!session.waitFor([](const QJsonObject &r) {
+        return r.value(QLatin1String("event")) == QLatin1String("property") && name(r) == QLatin1String("BACKGROUND_VISIBLE");
+    }).isEmpty());
+    const int application = session.surfaceWith(QStringLiteral("BACKGROUND_VISIBLE"));
+    session.send(QStringLiteral("focus"));
+    QVERIFY(session.waitForLog(QStringLiteral("e2e: active true")));
+
+    session.send(QStringLiteral("key back"));
+    QVERIFY(session.waitForLog(QStringLiteral("e2e: second page inactive")));
+    const QString log = session.log();
+    QVERIFY(log.contains(QLatin1String("e2e: depth 1")));
+    QVERIFY2(log.indexOf(QLatin1String("e2e: second page deactivating")) < log.indexOf(QLatin1String("e2e: second page inactive")),
+             qPrintable(log.right(400)));
+    session.send(QStringLiteral("key back"));
+    QCOMPARE(session.waitForEvent(QStringLiteral("lower")).value(QLatin1String("surface")).toInt(), application);
 }
 
 void tst_HomeScreen::leavesNoProcessBehind()

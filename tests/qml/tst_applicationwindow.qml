@@ -1,0 +1,51 @@
+import QtQuick 2.6
+import QtQuick.Window 2.2
+import QtTest 1.2
+import Quorvane.Pelkan 1.0
+
+// The application window: orientation chosen within what it and the current page allow,
+// content turned and laid out in the turned size.
+Item {
+    id: root
+    width: 400
+    height: 600
+
+    ApplicationWindow {
+        id: app
+        anchors.fill: parent
+        allowedOrientations: Orientation.Portrait | Orientation.Landscape
+    }
+
+    Component {
+        id: pageComponent
+        Page {}
+    }
+
+    TestCase {
+        name: "ApplicationWindow"
+        when: windowShown
+
+        function test_orientation_data() {
+            return [
+                { tag: "page allows portrait only", page: Orientation.Portrait, device: Orientation.Landscape, expected: Orientation.Portrait },
+                { tag: "page allows all", page: Orientation.All, device: Orientation.Landscape, expected: Orientation.Landscape },
+                { tag: "page allows landscape only", page: Orientation.Landscape, device: Orientation.Portrait, expected: Orientation.Landscape },
+                { tag: "page allows only what the window does not", page: Orientation.PortraitInverted,
+                  device: Orientation.Landscape, expected: Orientation.Landscape },
+            ]
+        }
+
+        function test_orientation(data) {
+            app.pageStack.clear()
+            var page = app.pageStack.push(pageComponent, { "allowedOrientations": data.page }, PageStackAction.Immediate)
+            app.deviceOrientation = data.device
+            compare(app.orientation, data.expected)
+            compare(page.orientation, data.expected)
+            // Turned against the display, the content swaps its sides.
+            var turned = Screen.angleBetween(Screen.orientation, data.expected) % 180 !== 0
+            compare(app.contentItem.width, turned ? app.height : app.width)
+            compare(page.width, app.contentItem.width)
+            tryCompare(app.contentItem, "rotation", Screen.angleBetween(Screen.orientation, data.expected))
+        }
+    }
+}

@@ -1,0 +1,151 @@
+import QtQuick 2.6
+import QtTest 1.2
+import Quorvane.Pelkan 1.0
+import Quorvane.Pelkan.private 1.0 as Private
+
+// TouchBlocker, InverseMouseArea and DragFilter with real presses.
+Item {
+    id: root
+    width: 400
+    height: 600
+
+    MouseArea {
+        id: below
+        objectName: "below"
+        property int clicks: 0
+        x: 0; y: 0; width: 200; height: 200
+        onClicked: clicks++
+    }
+    TouchBlocker {
+        id: blocker
+        x: 0; y: 0; width: 200; height: 200
+    }
+
+    MouseArea {
+        id: button
+        property int clicks: 0
+        x: 0; y: 400; width: 100; height: 100
+        onClicked: clicks++
+    }
+    Rectangle {
+        id: menu
+        x: 200; y: 200; width: 200; height: 200
+        InverseMouseArea {
+            id: outside
+            anchors.fill: parent
+            insideItems: [opener]
+            property var seen: []
+            onPressedOutside: seen.push("pressed " + Math.round(x) + "," + Math.round(y))
+            onClickedOutside: seen.push("clicked")
+            onCanceledOutside: seen.push("canceled")
+        }
+    }
+    Item { id: opener; x: 300; y: 500; width: 100; height: 100 }
+
+    ApplicationWindow {
+        id: app
+        x: 0; y: 0; width: 400; height: 600
+        visible: false
+    }
+
+    Component {
+        id: sliderPage
+        Page {
+            property alias slider: slider
+            MouseArea {
+                id: slider
+                property int moves: 0
+                y: 200
+                width: parent.width
+                height: 100
+                Private.DragFilter.orientations: Qt.Horizontal
+                onPositionChanged: moves++
+            }
+        }
+    }
+
+    TestCase {
+        name: "TouchHelpers"
+        when: windowShown
+
+        function tap(input, item, x, y) {
+            if (input === "touch") {
+                var touch = touchEvent(item)
+                touch.press(0, item, x, y).commit()
+                touch.release(0, item, x, y).commit()
+            } else {
+                mouseClick(item, x, y)
+            }
+        }
+
+        function test_blocker_data() {
+            return [
+                { tag: "mouse, enabled", input: "mouse", enabled: true, clicks: 0 },
+                { tag: "touch, enabled", input: "touch", enabled: true, clicks: 0 },
+                { tag: "mouse, disabled", input: "mouse", enabled: false, clicks: 1 },
+                { tag: "touch, disabled", input: "touch", enabled: false, clicks: 1 },
+            ]
+        }
+
+        function test_blocker(data) {
+            below.clicks = 0
+            blocker.enabled = data.enabled
+            tap(data.input, root, 100, 100)
+            mouseWheel(root, 100, 100, 0, -120)
+            compare(below.clicks, data.clicks)
+        }
+
+        function test_inverse_data() {
+            return [
+                { tag: "mouse outside, on a button", input: "mouse", x: 50, y: 450, seen: ["pressed -150,250", "clicked"], clicks: 1 },
+                { tag: "touch outside, on a button", input: "touch", x: 50, y: 450, seen: ["pressed -150,250", "clicked"], clicks: 1 },
+                { tag: "inside", input: "mouse", x: 300, y: 300, seen: [], clicks: 0 },
+                { tag: "on an item that counts as inside", input: "touch", x: 350, y: 550, seen: [], clicks: 0 },
+                { tag: "disabled", input: "mouse", x: 50, y: 450, disabled: true, seen: [], clicks: 1 },
+            ]
+        }
+
+        function test_inverse(data) {
+            button.clicks = 0
+            outside.seen = []
+            outside.enabled = !data.disabled
+            tap(data.input, root, data.x, data.y)
+            compare(outside.seen, data.seen)
+            compare(button.clicks, data.clicks, "the press is not taken")
+            verify(!outside.pressed)
+            outside.enabled = true
+        }
+
+        function test_dragOutsideIsNoClick() {
+            outside.seen = []
+            mousePress(root, 50, 450)
+            mouseMove(root, 150, 450)
+            mouseRelease(root, 150, 450)
+            compare(outside.seen, ["pressed -150,250"])
+        }
+
+        function test_dragFilter_data() {
+            return [
+                { tag: "claimed sideways", orientations: Qt.Horizontal, depth: 2 },
+                { tag: "claimed up and down only", orientations: Qt.Vertical, depth: 1 },
+            ]
+        }
+
+        // A slider on a page keeps its sideways drag; the page goes with any other.
+        function test_dragFilter(data) {
+            app.visible = true
+            var stack = app.pageStack
+            stack.clear()
+            stack.push(sliderPage, {}, PageStackAction.Immediate)
+            var page = stack.push(sliderPage, {}, PageStackAction.Immediate)
+            page.slider.Private.DragFilter.orientations = data.orientations
+            mousePress(stack, 20, 250)
+            for (var x = 40; x <= 340; x += 20)
+                mouseMove(stack, x, 250)
+            mouseRelease(stack, 340, 250)
+            tryCompare(stack, "busy", false)
+            compare(stack.depth, data.depth)
+            app.visible = false
+        }
+    }
+}
