@@ -52,6 +52,8 @@ int main(int argc, char *argv[])
     engine.load(QUrl(QStringLiteral("qrc:/gallery/main.qml")));
     // The application window makes the window it lives in.
     auto root = engine.rootObjects().isEmpty() ? nullptr : qobject_cast<QQuickItem *>(engine.rootObjects().first());
+    for (int turn = 0; root && !root->window() && turn < 10; ++turn)
+        QCoreApplication::processEvents(); // it makes its window once loading is over
     QQuickWindow *window = root ? root->window() : nullptr;
     if (!window)
         return 1;

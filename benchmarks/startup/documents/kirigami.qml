@@ -1,11 +1,16 @@
 import QtQuick 2.6
 import org.kde.kirigami 2.10 as Kirigami
 
-Kirigami.Page {
+// The same application with Kirigami.
+Kirigami.ApplicationWindow {
     width: 540
     height: 960
-    Kirigami.Heading {
-        anchors.centerIn: parent
-        text: "Hello"
+    visible: true
+    pageStack.initialPage: Kirigami.ScrollablePage {
+        title: "Hello"
+        ListView {
+            model: 50
+            delegate: Kirigami.BasicListItem { label: "Row " + index }
+        }
     }
 }

@@ -1,15 +1,28 @@
 import QtQuick 2.6
 import Quorvane.Pelkan 1.0
-import Quorvane.Pelkan.private 1.0 as Private
 
-Private.ControlBase {
+// An application window, its page stack, and a page with a header and a 50-row list.
+ApplicationWindow {
     width: 540
     height: 960
-    Rectangle { anchors.fill: parent; color: "black" }
-    Text {
-        anchors.centerIn: parent
-        text: "Hello"
-        color: parent.palette.highlightColor
-        font.pixelSize: Theme.fontSizeLarge
+    initialPage: Component {
+        Page {
+            PageHeader { id: header; title: "Hello" }
+            ListView {
+                anchors { top: header.bottom; left: parent.left; right: parent.right; bottom: parent.bottom }
+                model: 50
+                delegate: Item {
+                    width: ListView.view.width
+                    height: Theme.itemSizeSmall
+                    Text {
+                        x: Theme.horizontalPageMargin
+                        anchors.verticalCenter: parent.verticalCenter
+                        text: "Row " + index
+                        color: Theme.primaryColor
+                        font.pixelSize: Theme.fontSizeMedium
+                    }
+                }
+            }
+        }
     }
 }

@@ -86,17 +86,22 @@ Private.Window {
         _setCover(coverWindow)
     }
 
+    function _ensureWindow() {
+        // Still without a parent once loading is over (QQmlApplicationEngine, not a view
+        // that sets one after creating it): it makes a window of its own.
+        if (window.parent)
+            return
+        _host = hostComponent.createObject(null, { "width": window.width, "height": window.height })
+        window.parent = _host.contentItem
+        window.width = Qt.binding(function() { return _host.width })
+        window.height = Qt.binding(function() { return _host.height })
+    }
+
     Component.onCompleted: {
-        // Without a window of its own (QQmlApplicationEngine), it makes one.
-        if (!window.parent) {
-            _host = hostComponent.createObject(null, { "width": window.width, "height": window.height })
-            window.parent = _host.contentItem
-            window.width = Qt.binding(function() { return _host.width })
-            window.height = Qt.binding(function() { return _host.height })
-        }
         if (initialPage)
             stack.push(initialPage, {}, PageStackAction.Immediate)
         _makeCover()
+        Qt.callLater(_ensureWindow)
     }
     Component.onDestruction: {
         if (_coverWindow)
