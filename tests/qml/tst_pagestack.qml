@@ -177,15 +177,31 @@ Item {
             dialog.destroy()
         }
 
-        function test_pagesByName() {
-            // Instances stay the application's: popped, they go back where they were.
-            var own = pageComponent.createObject(root, { "name": "own" })
-            stack.push(own, {}, PageStackAction.Immediate)
+        function test_pageKinds_data() {
+            return [
+                { tag: "component", page: pageComponent },
+                { tag: "URL", page: Qt.resolvedUrl("../../qml/Quorvane/Pelkan/pages/Page.qml") },
+                { tag: "module and name", page: "Quorvane.Pelkan.Page" },
+                { tag: "module path and name", page: "Quorvane/Pelkan/Page" },
+                { tag: "instance", instance: true },
+            ]
+        }
+
+        function test_pageKinds(data) {
+            var own = data.instance ? pageComponent.createObject(root, { "name": "own" }) : null
+            var page = stack.push(own || data.page, { "backNavigation": false }, PageStackAction.Immediate)
+            verify(page)
+            compare(stack.currentPage, page)
+            compare(page.backNavigation, false, "properties given with the push")
             compare(stack.find(function(p) { return p.name === "A" }).name, "A")
             stack.pop(PageStackAction.Immediate)
-            compare(own.parent, root)
-            verify(!own.visible)
-            own.destroy()
+            compare(stack.depth, 2)
+            if (own) {
+                // Instances stay the application's: popped, they go back where they were.
+                compare(own.parent, root)
+                verify(!own.visible)
+                own.destroy()
+            }
         }
     }
 }

@@ -153,8 +153,9 @@ PageStackBase {
             var component = page
             if (typeof page === "string" || page instanceof String) {
                 var url = String(page)
-                if (url.indexOf(":") < 0 && url.indexOf("/") < 0 && url.indexOf(".qml") < 0)
-                    url = resolveImportPage(url)
+                // "Module.Page" or "Module/Page": a page listed in a module's qmldir.
+                if (url.indexOf(":") < 0 && !/\.qml$/.test(url))
+                    url = resolveImportPage(url.replace(/\//g, "."))
                 component = Qt.createComponent(url)
             }
             if (!component || component.status === Component.Error) {
