@@ -5,13 +5,15 @@ SANITIZE_BUILD ?= build-sanitize
 FUZZ_SECONDS ?= 20
 JOBS ?= $(shell nproc)
 
-.PHONY: demo check check-sanitized deps build
+.PHONY: demo check check-sanitized deb deps build
 
 demo: build
 	scripts/run-demo $(BUILD)
 
+# Every test, then the packages: built, installed, and used by the application template.
 check: build
 	scripts/run-tests $(BUILD)
+	scripts/check-package build-package
 
 # Every test again under AddressSanitizer and UndefinedBehaviorSanitizer, then each fuzz
 # target for FUZZ_SECONDS; built with clang so that the fuzz targets use libFuzzer.
@@ -21,6 +23,10 @@ check-sanitized: deps
 	cmake --build $(SANITIZE_BUILD) -j $(JOBS)
 	scripts/run-tests $(SANITIZE_BUILD)
 	scripts/run-fuzz $(SANITIZE_BUILD) $(FUZZ_SECONDS)
+
+# The Debian packages (runtime modules, development files, gallery and tools) in build-deb/.
+deb: deps
+	scripts/build-deb build-deb
 
 build: deps
 	cmake -S . -B $(BUILD) -DCMAKE_BUILD_TYPE=RelWithDebInfo
