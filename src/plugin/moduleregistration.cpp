@@ -17,6 +17,7 @@
 #include "declarativepagestackbase.h"
 #include "declarativestandardpaths.h"
 #include "declarativetouchblocker.h"
+#include "declarativevisibilitycull.h"
 #include "declarativewindow.h"
 #include "formattingproxymodel.h"
 #include "minversemousearea.h"
@@ -113,6 +114,7 @@ void registerPrivateModule(const char *uri)
     qmlRegisterType<DeclarativeCoverWindow>(uri, 1, 0, "CoverWindow");
     registerUncreatable<DeclarativeDragFilter>(uri, "DragFilter");
     qmlRegisterType<DeclarativePreeditText>(uri, 1, 0, "PreeditText");
+    qmlRegisterType<DeclarativeVisibilityCull>(uri, 1, 0, "VisibilityCull");
     qmlRegisterType<PulleyMenuLogic>(uri, 1, 0, "PulleyMenuLogic");
     qmlRegisterType<BlurEffect>(uri, 1, 0, "BlurEffect");
     qmlRegisterType<AutoFill>(uri, 1, 0, "AutoFill");
