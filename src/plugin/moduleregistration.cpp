@@ -18,6 +18,7 @@
 #include "declarativestandardpaths.h"
 #include "declarativetouchblocker.h"
 #include "declarativevisibilitycull.h"
+#include "dragdetectoritem.h"
 #include "declarativewindow.h"
 #include "formattingproxymodel.h"
 #include "minversemousearea.h"
@@ -116,6 +117,7 @@ void registerPrivateModule(const char *uri)
     qmlRegisterType<DeclarativePreeditText>(uri, 1, 0, "PreeditText");
     qmlRegisterType<DeclarativeVisibilityCull>(uri, 1, 0, "VisibilityCull");
     qmlRegisterType<PulleyMenuLogic>(uri, 1, 0, "PulleyMenuLogic");
+    qmlRegisterType<DragDetectorItem>(uri, 1, 0, "DragDetectorItem");
     qmlRegisterType<BlurEffect>(uri, 1, 0, "BlurEffect");
     qmlRegisterType<AutoFill>(uri, 1, 0, "AutoFill");
     registerUncreatable<TimePickerMode>(uri, "TimePickerMode");

@@ -1,0 +1,89 @@
+import QtQuick 2.6
+import QtTest 1.2
+import Quorvane.Pelkan 1.0
+
+// List items with real presses: click, long press opening the context menu below the item
+// and pushing the next rows aside, a tap on a menu item, a press elsewhere closing it, and
+// a swipe over an item dropping its highlight.
+Item {
+    id: root
+    width: 400
+    height: 800
+
+    property var log: []
+
+    ListView {
+        id: view
+        anchors.fill: parent
+        model: 5
+        delegate: ListItem {
+            id: row
+            objectName: "row" + index
+            onClicked: root.log.push("clicked " + index)
+            menu: Component {
+                ContextMenu {
+                    MenuItem { text: "Delete"; onClicked: root.log.push("delete " + index) }
+                }
+            }
+            Text { text: "Row " + index; anchors.verticalCenter: parent.verticalCenter }
+        }
+    }
+
+    TestCase {
+        name: "ListItem"
+        when: windowShown
+
+        function row(i) { return view.itemAtIndex(i) }
+
+        function init() {
+            root.log = []
+            for (var i = 0; i < 5; ++i)
+                row(i).closeMenu()
+        }
+
+        function longPress(item) {
+            mousePress(item, 50, 10)
+            tryCompare(item, "menuOpen", true, 3000)
+            mouseRelease(item, 50, 10)
+        }
+
+        function test_click() {
+            mousePress(row(1), 50, 10)
+            verify(row(1).highlighted)
+            mouseRelease(row(1), 50, 10)
+            compare(root.log, ["clicked 1"])
+            verify(!row(1).highlighted)
+        }
+
+        function test_menu_data() {
+            return [
+                { tag: "a tap on its item runs it and closes it", tap: "item", log: ["delete 1"] },
+                { tag: "a press on another row closes it", tap: "row", log: ["clicked 3"] },
+            ]
+        }
+
+        function test_menu(data) {
+            var below = row(2).y
+            longPress(row(1))
+            tryVerify(function() { return row(2).y > below }, 2000, "the rows below make room")
+            compare(root.log, [])
+            if (data.tap === "item")
+                mouseClick(row(1), 50, row(1).contentHeight + 10)
+            else
+                mouseClick(row(3), 50, 10)
+            tryCompare(row(1), "menuOpen", false)
+            compare(root.log, data.log)
+            tryCompare(row(2), "y", below)
+        }
+
+        function test_swipeDropsTheHighlight() {
+            mousePress(row(1), 50, 10)
+            verify(row(1).highlighted)
+            for (var x = 55; x <= 100; x += 5)
+                mouseMove(row(1), x, 10)
+            verify(!row(1).highlighted)
+            verify(row(1).down)
+            mouseRelease(row(1), 100, 10)
+        }
+    }
+}
