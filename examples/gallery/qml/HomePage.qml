@@ -10,7 +10,7 @@ Page {
         { name: "theme", title: "Theme" }, { name: "images", title: "Images" },
         { name: "orientation", title: "Orientation" }, { name: "format", title: "Formatting" },
         { name: "gestures", title: "Gestures" }, { name: "cover", title: "Cover" },
-        { name: "text", title: "Text input" }
+        { name: "text", title: "Text input" }, { name: "lists", title: "Lists and menus" }
     ]
 
     function openDialog(operationType) {
@@ -36,9 +36,14 @@ Page {
                 objectName: "subject-" + modelData.name
                 width: page.width
                 height: Theme.itemSizeSmall
-                onClicked: page.pageStack.push(Qt.resolvedUrl("SubjectPage.qml"),
-                                               { "name": modelData.name, "title": modelData.title,
-                                                 "application": page._window })
+                onClicked: {
+                    if (modelData.name === "lists")
+                        page.pageStack.push(Qt.resolvedUrl("ListsPage.qml"))
+                    else
+                        page.pageStack.push(Qt.resolvedUrl("SubjectPage.qml"),
+                                            { "name": modelData.name, "title": modelData.title,
+                                              "application": page._window })
+                }
                 Rectangle {
                     anchors.fill: parent
                     color: Theme.highlightBackgroundColor

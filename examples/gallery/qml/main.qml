@@ -8,7 +8,7 @@ ApplicationWindow {
     id: app
 
     // Which subject the gallery opens on, over the home page: theme, images, orientation,
-    // format, gestures, cover, text, dialog; "home" for none.
+    // format, gestures, cover, text, dialog, lists; "home" for none.
     property string startPage: "home"
     property int played: 0
     property int skipped: 0
@@ -26,6 +26,8 @@ ApplicationWindow {
     Component.onCompleted: {
         if (startPage === "dialog")
             pageStack.currentPage.openDialog(PageStackAction.Immediate)
+        else if (startPage === "lists")
+            pageStack.push(Qt.resolvedUrl("ListsPage.qml"), {}, PageStackAction.Immediate)
         else if (startPage !== "home")
             pageStack.push(Qt.resolvedUrl("SubjectPage.qml"), { "name": startPage, "application": app },
                            PageStackAction.Immediate)
