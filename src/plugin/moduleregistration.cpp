@@ -19,6 +19,7 @@
 #include "declarativetouchblocker.h"
 #include "declarativevisibilitycull.h"
 #include "dragdetectoritem.h"
+#include "remorsecache.h"
 #include "declarativewindow.h"
 #include "formattingproxymodel.h"
 #include "minversemousearea.h"
@@ -118,6 +119,7 @@ void registerPrivateModule(const char *uri)
     qmlRegisterType<DeclarativeVisibilityCull>(uri, 1, 0, "VisibilityCull");
     qmlRegisterType<PulleyMenuLogic>(uri, 1, 0, "PulleyMenuLogic");
     qmlRegisterType<DragDetectorItem>(uri, 1, 0, "DragDetectorItem");
+    registerUncreatable<RemorseCache>(uri, "RemorseCache");
     qmlRegisterType<BlurEffect>(uri, 1, 0, "BlurEffect");
     qmlRegisterType<AutoFill>(uri, 1, 0, "AutoFill");
     registerUncreatable<TimePickerMode>(uri, "TimePickerMode");

@@ -1,9 +1,9 @@
 import QtQuick 2.6
 import Quorvane.Pelkan 1.0
 
-// A long list with what lists have: a pull-down menu to add and clear, a push-up menu to go
-// back to the top, rows with a context menu, sections, a scroll bar, and a placeholder when
-// the list is empty.
+// A long list with what lists have: a pull-down menu to clear (with a remorse over the
+// page) and fill, a push-up menu back to the top, rows with a context menu whose removal
+// counts down on the row, sections, a scroll bar, and a placeholder when the list is empty.
 Page {
     id: page
 
@@ -19,7 +19,21 @@ Page {
                 fruit.append({ "name": names[i] + (round ? " " + (round + 1) : ""), "letter": names[i].charAt(0) })
     }
 
+    // Made here, not in a delegate: the countdown outlives delegates that scroll away.
+    function removeLater(name) {
+        return function() {
+            for (var i = 0; i < fruit.count; ++i) {
+                if (fruit.get(i).name === name) {
+                    fruit.remove(i)
+                    return
+                }
+            }
+        }
+    }
+
     Component.onCompleted: fill()
+
+    RemorsePopup { id: clearing }
 
     ListView {
         id: view
@@ -36,7 +50,7 @@ Page {
             id: row
             menu: Component {
                 ContextMenu {
-                    MenuItem { text: "Remove"; onClicked: fruit.remove(index) }
+                    MenuItem { text: "Remove"; onClicked: row.remorseAction("Removing", page.removeLater(model.name)) }
                     MenuItem { text: "Move to the top"; onClicked: fruit.move(index, 0, 1) }
                 }
             }
@@ -50,7 +64,7 @@ Page {
         }
 
         PullDownMenu {
-            MenuItem { text: "Clear"; onClicked: fruit.clear() }
+            MenuItem { text: "Clear"; onClicked: clearing.execute("Clearing", function() { fruit.clear() }) }
             MenuItem { text: "Fill again"; onClicked: page.fill() }
         }
         PushUpMenu {
