@@ -17,6 +17,7 @@
 #include "declarativepagestackbase.h"
 #include "declarativestandardpaths.h"
 #include "declarativetouchblocker.h"
+#include "declarativequickscrollbuttonbase.h"
 #include "declarativevisibilitycull.h"
 #include "dragdetectoritem.h"
 #include "remorsecache.h"
@@ -115,6 +116,7 @@ void registerPrivateModule(const char *uri)
     qmlRegisterType<DeclarativeWindow>(uri, 1, 0, "Window");
     qmlRegisterType<DeclarativeCoverWindow>(uri, 1, 0, "CoverWindow");
     registerUncreatable<DeclarativeDragFilter>(uri, "DragFilter");
+    qmlRegisterType<DeclarativeQuickScrollButtonBase>(uri, 1, 0, "QuickScrollButtonBase");
     qmlRegisterType<DeclarativePreeditText>(uri, 1, 0, "PreeditText");
     qmlRegisterType<DeclarativeVisibilityCull>(uri, 1, 0, "VisibilityCull");
     qmlRegisterType<PulleyMenuLogic>(uri, 1, 0, "PulleyMenuLogic");

@@ -3,7 +3,8 @@ import Quorvane.Pelkan 1.0
 
 // A long list with what lists have: a pull-down menu to clear (with a remorse over the
 // page) and fill, a push-up menu back to the top, rows with a context menu whose removal
-// counts down on the row, sections, a scroll bar, and a placeholder when the list is empty.
+// counts down on the row, sections, a scroll bar, a quick-scroll button, and a placeholder
+// when the list is empty.
 Page {
     id: page
 
@@ -79,4 +80,5 @@ Page {
         }
         ScrollDecorator { flickable: view }
     }
+    QuickScroll { flickable: view }
 }
