@@ -1,0 +1,117 @@
+// Lists, in one process, alternating rounds: the work per frame (synchronising to swap)
+// while a 1000-row ListView scrolls a step per frame, with Pelkan's ListItem against Qt
+// Quick Controls 2's ItemDelegate; and while a pull-down menu is dragged open over the
+// Pelkan list against the same list without a menu. Prints medians and ratios.
+
+#include <QElapsedTimer>
+#include <QGuiApplication>
+#include <QQmlComponent>
+#include <QQmlEngine>
+#include <QQuickItem>
+#include <QQuickView>
+#include <QTest>
+#include <QTextStream>
+
+#include <algorithm>
+#include <atomic>
+#include <vector>
+
+namespace {
+
+QByteArray document(const QByteArray &kind)
+{
+    if (kind == "qqc2")
+        return "import QtQuick 2.6\nimport QtQuick.Controls 2.15\n"
+               "ListView { width: 540; height: 960; model: 1000\n"
+               "  delegate: ItemDelegate { width: ListView.view.width; height: 80; text: 'Row ' + index } }\n";
+    QByteArray text = "import QtQuick 2.6\nimport Quorvane.Pelkan 1.0\n"
+                      "ListView { width: 540; height: 960; model: 1000\n"
+                      "  delegate: ListItem { contentHeight: 80\n"
+                      "    Text { x: 24; anchors.verticalCenter: parent.verticalCenter; text: 'Row ' + index; color: 'white' } }\n";
+    if (kind == "menu")
+        text += "  PullDownMenu { MenuItem { text: 'One' } MenuItem { text: 'Two' } MenuItem { text: 'Three' } }\n";
+    return text + "}\n";
+}
+
+// Milliseconds of work per frame: scrolling (drag = false) sets contentY a step per frame;
+// dragging moves a finger down from the top, pulling the content past its start.
+double run(const QByteArray &kind, bool drag)
+{
+    QQuickView view;
+    view.engine()->addImportPath(QStringLiteral(PELKAN_QML_DIR));
+    QQmlComponent component(view.engine());
+    component.setData(document(kind), QUrl());
+    auto root = qobject_cast<QQuickItem *>(component.create());
+    if (!root) {
+        QTextStream(stderr) << component.errorString();
+        return 0;
+    }
+    view.setContent(QUrl(), nullptr, root);
+    view.show();
+    QTest::qWaitForWindowExposed(&view);
+
+    QElapsedTimer clock;
+    clock.start();
+    std::atomic<qint64> syncStart { 0 };
+    std::atomic<qint64> total { 0 };
+    std::atomic<int> swaps { 0 };
+    QObject::connect(&view, &QQuickWindow::beforeSynchronizing, &view, [&] { syncStart = clock.nsecsElapsed(); },
+                     Qt::DirectConnection);
+    QObject::connect(&view, &QQuickWindow::frameSwapped, &view, [&] {
+        total += clock.nsecsElapsed() - syncStart;
+        ++swaps;
+    }, Qt::DirectConnection);
+    QTest::qWait(100);
+    total = 0;
+    swaps = 0;
+
+    auto nextFrame = [&] {
+        const int seen = swaps;
+        QElapsedTimer waited;
+        waited.start();
+        while (swaps == seen && waited.elapsed() < 1000)
+            QCoreApplication::processEvents(QEventLoop::AllEvents, 5);
+    };
+    if (drag) {
+        int y = 20;
+        QTest::mousePress(&view, Qt::LeftButton, {}, QPoint(270, y));
+        for (int i = 0; i < 60; ++i) {
+            y += 12;
+            QTest::mouseMove(&view, QPoint(270, y), 16);
+            nextFrame();
+        }
+        QTest::mouseRelease(&view, Qt::LeftButton, {}, QPoint(270, y), 16);
+    } else {
+        for (int i = 1; i <= 150; ++i) {
+            root->setProperty("contentY", i * 53);
+            nextFrame();
+        }
+    }
+    return double(total) / 1e6 / qMax(1, int(swaps));
+}
+
+double median(std::vector<double> values)
+{
+    std::sort(values.begin(), values.end());
+    return values[values.size() / 2];
+}
+
+} // namespace
+
+int main(int argc, char *argv[])
+{
+    QGuiApplication app(argc, argv);
+    QTextStream out(stdout);
+    std::vector<double> ours, theirs, menu, plain;
+    for (int round = 0; round < 3; ++round) {
+        ours.push_back(run("pelkan", false));
+        theirs.push_back(run("qqc2", false));
+        menu.push_back(run("menu", true));
+        plain.push_back(run("pelkan", true));
+    }
+    out << QStringLiteral("1000-row list scrolled, work per frame (median of 3): ListItem %1 ms, ItemDelegate %2 ms, %3x\n")
+               .arg(median(ours), 0, 'f', 2).arg(median(theirs), 0, 'f', 2).arg(median(ours) / median(theirs), 0, 'f', 2);
+    out << QStringLiteral("Pull-down menu dragged open over it: %1 ms, the list without a menu %2 ms, %3x\n")
+               .arg(median(menu), 0, 'f', 2).arg(median(plain), 0, 'f', 2).arg(median(menu) / median(plain), 0, 'f', 2);
+    return 0;
+}
