@@ -2,6 +2,8 @@
 // process: rows drawn, and the work per frame (synchronising to swap, render thread) and
 // per step (the GUI thread's share). Prints both and the ratios.
 
+#include "../common/framework.h"
+
 #include <QElapsedTimer>
 #include <QGuiApplication>
 #include <QQmlComponent>
@@ -12,7 +14,6 @@
 #include <QTextStream>
 
 #include <algorithm>
-#include <atomic>
 #include <vector>
 
 namespace {
@@ -46,33 +47,18 @@ Result run(bool cull, int frames)
     }
     view.setContent(QUrl(), nullptr, root);
     view.show();
-    QTest::qWaitForWindowExposed(&view);
+    if (!QTest::qWaitForWindowExposed(&view))
+        return {};
 
-    QElapsedTimer clock;
-    clock.start();
-    std::atomic<qint64> syncStart { 0 };
-    std::atomic<qint64> total { 0 };
-    std::atomic<int> swaps { 0 };
-    QObject::connect(&view, &QQuickWindow::beforeSynchronizing, &view, [&] { syncStart = clock.nsecsElapsed(); },
-                     Qt::DirectConnection);
-    QObject::connect(&view, &QQuickWindow::frameSwapped, &view, [&] {
-        total += clock.nsecsElapsed() - syncStart;
-        ++swaps;
-    }, Qt::DirectConnection);
-
+    FrameWork work(view);
     QTest::qWait(100);
-    total = 0;
-    swaps = 0;
+    work.reset();
     for (int i = 0; i < frames; ++i) {
         root->setProperty("contentY", ((i + 1) * 37) % 50000); // a new position every frame
-        const int seen = swaps;
-        QElapsedTimer waited;
-        waited.start();
-        while (swaps == seen && waited.elapsed() < 1000)
-            QCoreApplication::processEvents(QEventLoop::AllEvents, 5);
+        work.waitForFrame();
     }
     Result result;
-    result.frameMs = double(total) / 1e6 / qMax(1, int(swaps));
+    result.frameMs = work.msPerFrame();
     QObject *culling = root->findChild<QObject *>(QStringLiteral("cull"));
     result.drawn = culling ? culling->property("drawnCount").toInt() : 1000;
     return result;

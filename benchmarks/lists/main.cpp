@@ -3,6 +3,8 @@
 // Quick Controls 2's ItemDelegate; and while a pull-down menu is dragged open over the
 // Pelkan list against the same list without a menu. Prints medians and ratios.
 
+#include "../common/framework.h"
+
 #include <QElapsedTimer>
 #include <QGuiApplication>
 #include <QQmlComponent>
@@ -13,7 +15,6 @@
 #include <QTextStream>
 
 #include <algorithm>
-#include <atomic>
 #include <vector>
 
 namespace {
@@ -48,46 +49,29 @@ double run(const QByteArray &kind, bool drag)
     }
     view.setContent(QUrl(), nullptr, root);
     view.show();
-    QTest::qWaitForWindowExposed(&view);
+    if (!QTest::qWaitForWindowExposed(&view))
+        return {};
 
-    QElapsedTimer clock;
-    clock.start();
-    std::atomic<qint64> syncStart { 0 };
-    std::atomic<qint64> total { 0 };
-    std::atomic<int> swaps { 0 };
-    QObject::connect(&view, &QQuickWindow::beforeSynchronizing, &view, [&] { syncStart = clock.nsecsElapsed(); },
-                     Qt::DirectConnection);
-    QObject::connect(&view, &QQuickWindow::frameSwapped, &view, [&] {
-        total += clock.nsecsElapsed() - syncStart;
-        ++swaps;
-    }, Qt::DirectConnection);
+    FrameWork work(view);
     QTest::qWait(100);
-    total = 0;
-    swaps = 0;
+    work.reset();
 
-    auto nextFrame = [&] {
-        const int seen = swaps;
-        QElapsedTimer waited;
-        waited.start();
-        while (swaps == seen && waited.elapsed() < 1000)
-            QCoreApplication::processEvents(QEventLoop::AllEvents, 5);
-    };
     if (drag) {
         int y = 20;
         QTest::mousePress(&view, Qt::LeftButton, {}, QPoint(270, y));
         for (int i = 0; i < 60; ++i) {
             y += 12;
             QTest::mouseMove(&view, QPoint(270, y), 16);
-            nextFrame();
+            work.waitForFrame();
         }
         QTest::mouseRelease(&view, Qt::LeftButton, {}, QPoint(270, y), 16);
     } else {
         for (int i = 1; i <= 150; ++i) {
             root->setProperty("contentY", i * 53);
-            nextFrame();
+            work.waitForFrame();
         }
     }
-    return double(total) / 1e6 / qMax(1, int(swaps));
+    return work.msPerFrame();
 }
 
 double median(std::vector<double> values)
