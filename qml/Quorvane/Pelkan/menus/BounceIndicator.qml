@@ -1,0 +1,33 @@
+import QtQuick 2.6
+import Quorvane.Pelkan 1.0
+
+// Where a flickable has no menu, a glow at the edge of its content that grows while the
+// content is dragged past that edge (from the native bounce effect's difference) and fades
+// when the finger lets go. Declare it inside the flickable, in an ApplicationWindow.
+Item {
+    id: indicator
+
+    property Flickable flickable: parent && parent.parent && parent.parent.hasOwnProperty("contentY") ? parent.parent : null
+    readonly property bool active: effect.active
+    // 0 to 1: how far past the edge, against a large item's height, while dragged past it.
+    readonly property real amount: active ? Math.min(1, Math.abs(effect.difference) / Theme.itemSizeLarge) : 0
+    readonly property bool _atTop: !flickable || flickable.contentY <= flickable.originY + 1
+
+    BounceEffect {
+        id: effect
+        flickable: indicator.flickable
+    }
+
+    Rectangle {
+        parent: indicator.flickable
+        width: parent ? parent.width : 0
+        height: Theme.paddingLarge * 2 * indicator.amount
+        y: indicator._atTop ? 0 : (parent ? parent.height - height : 0)
+        opacity: indicator.active ? 1 : 0
+        Behavior on opacity { OpacityAnimator { duration: 200 } }
+        gradient: Gradient {
+            GradientStop { position: 0; color: indicator._atTop ? Theme.highlightColor : "transparent" }
+            GradientStop { position: 1; color: indicator._atTop ? "transparent" : Theme.highlightColor }
+        }
+    }
+}
