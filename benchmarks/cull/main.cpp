@@ -2,6 +2,7 @@
 // process: rows drawn, and the work per frame (synchronising to swap, render thread) and
 // per step (the GUI thread's share). Prints both and the ratios.
 
+#include "../common/documentview.h"
 #include "../common/framework.h"
 
 #include <QElapsedTimer>
@@ -37,17 +38,8 @@ struct Result {
 Result run(bool cull, int frames)
 {
     QQuickView view;
-    view.engine()->addImportPath(QStringLiteral(PELKAN_QML_DIR));
-    QQmlComponent component(view.engine());
-    component.setData(document(cull), QUrl());
-    auto root = qobject_cast<QQuickItem *>(component.create());
-    if (!root) {
-        QTextStream(stderr) << component.errorString();
-        return {};
-    }
-    view.setContent(QUrl(), nullptr, root);
-    view.show();
-    if (!QTest::qWaitForWindowExposed(&view))
+    QQuickItem *root = showDocument(view, document(cull), QStringLiteral(PELKAN_QML_DIR));
+    if (!root)
         return {};
 
     FrameWork work(view);

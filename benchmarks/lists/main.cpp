@@ -3,6 +3,7 @@
 // Quick Controls 2's ItemDelegate; and while a pull-down menu is dragged open over the
 // Pelkan list against the same list without a menu. Prints medians and ratios.
 
+#include "../common/documentview.h"
 #include "../common/framework.h"
 
 #include <QElapsedTimer>
@@ -39,18 +40,9 @@ QByteArray document(const QByteArray &kind)
 double run(const QByteArray &kind, bool drag)
 {
     QQuickView view;
-    view.engine()->addImportPath(QStringLiteral(PELKAN_QML_DIR));
-    QQmlComponent component(view.engine());
-    component.setData(document(kind), QUrl());
-    auto root = qobject_cast<QQuickItem *>(component.create());
-    if (!root) {
-        QTextStream(stderr) << component.errorString();
+    QQuickItem *root = showDocument(view, document(kind), QStringLiteral(PELKAN_QML_DIR));
+    if (!root)
         return 0;
-    }
-    view.setContent(QUrl(), nullptr, root);
-    view.show();
-    if (!QTest::qWaitForWindowExposed(&view))
-        return {};
 
     FrameWork work(view);
     QTest::qWait(100);
