@@ -92,5 +92,30 @@ Item {
             compare(data.menu.highlightedItem, null)
             tryCompare(data.menu, "active", false)
         }
+
+        // A flick towards the menu that would come to rest just short of the content's
+        // edge ends at the edge; one that ends well short stays where it ends.
+        function test_flickSnaps_data() {
+            return [
+                { tag: "just short: snaps to the edge", short: 0.5, snapped: true },
+                { tag: "well short: stays", short: 4, snapped: false },
+            ]
+        }
+
+        function test_flickSnaps(data) {
+            root.contentHeight = 6000
+            var velocity = Math.min(2 * pullDown._snapCalculationVelocity, flickable.maximumFlickVelocity)
+            var travel = velocity * velocity / (2 * flickable.flickDeceleration)
+            flickable.contentY = flickable.originY + travel + data.short * pullDown._snapThreshold
+            flickable.flick(0, velocity)
+            tryCompare(flickable, "moving", false, 5000)
+            tryCompare(pullDown, "_snapping", false)
+            if (data.snapped)
+                compare(flickable.contentY, flickable.originY)
+            else
+                verify(flickable.contentY - flickable.originY > pullDown._snapThreshold,
+                       "stopped at " + flickable.contentY)
+            compare(root.picked, [])
+        }
     }
 }
