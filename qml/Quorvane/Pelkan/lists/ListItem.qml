@@ -16,7 +16,7 @@ Item {
     readonly property bool highlighted: (mouseArea.pressed && !detector.dragging) || menuOpen
     readonly property bool menuOpen: _menuItem !== null && _menuItem.visible
     readonly property bool down: mouseArea.pressed
-    default property alias content: contentArea.data
+    default property alias content: mouseArea.data
 
     property Item _menuItem: null
     // The row in the view's model, and the view's cache of running remorse countdowns.
@@ -90,6 +90,8 @@ Item {
         _menuItem.y = Qt.binding(function() { return item.contentHeight })
         _menuItem.width = Qt.binding(function() { return item.width })
         _menuItem.visible = true
+        if (!_closer)
+            _closer = closerComponent.createObject(item)
         return _menuItem
     }
 
@@ -113,21 +115,29 @@ Item {
                     item.openMenu()
             }
 
+            // Below the content (declared first); not drawn at all while not highlighted.
             Rectangle {
                 anchors.fill: parent
+                visible: item.highlighted
                 color: Theme.highlightBackgroundColor
-                opacity: item.highlighted ? 0.3 : 0
-            }
-            Item {
-                id: contentArea
-                anchors.fill: parent
+                opacity: 0.3
             }
         }
     }
 
-    InverseMouseArea {
-        anchors.fill: parent
-        enabled: item.menuOpen
-        onPressedOutside: item.closeMenu()
+    // Made while the menu is open only: a thousand rows need not carry one each.
+    property Item _closer: null
+    onMenuOpenChanged: {
+        if (!menuOpen && _closer) {
+            _closer.destroy()
+            _closer = null
+        }
+    }
+    Component {
+        id: closerComponent
+        InverseMouseArea {
+            anchors.fill: parent
+            onPressedOutside: item.closeMenu()
+        }
     }
 }
