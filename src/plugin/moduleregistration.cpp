@@ -2,6 +2,15 @@
 
 #include "coreregistration.h"
 #include "autofill.h"
+#include "autoscrollcontroller.h"
+#include "buttonlayout.h"
+#include "declarativetextbaseitem.h"
+#include "declarativeunderline.h"
+#include "declarativevariantinterpolator.h"
+#include "horizontalautoscroll.h"
+#include "stringlistmodel.h"
+#include "textlayoutmodel.h"
+#include "verticalautoscroll.h"
 #include "blureffect.h"
 #include "declarativebounceeffect.h"
 #include "declarativeclipboard.h"
@@ -104,8 +113,11 @@ void registerPublicModule(const char *uri)
     qmlRegisterType<DeclarativeTouchBlocker>(uri, 1, 0, "TouchBlocker");
     qmlRegisterAnonymousType<QAbstractItemModel>(uri, 1);
     qmlRegisterType<FormattingProxyModel>(uri, 1, 0, "FormattingProxyModel");
+    qmlRegisterType<ButtonLayout>(uri, 1, 0, "ButtonLayout");
     qmlRegisterType<Pelkan::Palette>(uri, 1, 0, "Palette");
     registerUncreatable<DeclarativeBusyIndicatorSize>(uri, "BusyIndicatorSize");
+    registerUncreatable<HorizontalAutoScroll>(uri, "HorizontalAutoScroll");
+    registerUncreatable<VerticalAutoScroll>(uri, "VerticalAutoScroll");
 }
 
 void registerPrivateModule(const char *uri)
@@ -115,15 +127,21 @@ void registerPrivateModule(const char *uri)
     qmlRegisterRevision<QQuickWindow, 1>(uri, 1, 0);
     qmlRegisterType<DeclarativeWindow>(uri, 1, 0, "Window");
     qmlRegisterType<DeclarativeCoverWindow>(uri, 1, 0, "CoverWindow");
+    qmlRegisterType<DeclarativeUnderline>(uri, 1, 0, "Underline");
     registerUncreatable<DeclarativeDragFilter>(uri, "DragFilter");
     qmlRegisterType<DeclarativeQuickScrollButtonBase>(uri, 1, 0, "QuickScrollButtonBase");
     qmlRegisterType<DeclarativePreeditText>(uri, 1, 0, "PreeditText");
     qmlRegisterType<DeclarativeVisibilityCull>(uri, 1, 0, "VisibilityCull");
     qmlRegisterType<PulleyMenuLogic>(uri, 1, 0, "PulleyMenuLogic");
+    qmlRegisterType<DeclarativeTextBaseItem>(uri, 1, 0, "TextBaseItem");
+    qmlRegisterType<TextLayoutModel>(uri, 1, 0, "TextLayoutModel");
     qmlRegisterType<DragDetectorItem>(uri, 1, 0, "DragDetectorItem");
     registerUncreatable<RemorseCache>(uri, "RemorseCache");
     qmlRegisterType<BlurEffect>(uri, 1, 0, "BlurEffect");
+    qmlRegisterType<AutoScrollController>(uri, 1, 0, "AutoScrollController");
     qmlRegisterType<AutoFill>(uri, 1, 0, "AutoFill");
+    qmlRegisterType<StringListModel>(uri, 1, 0, "StringListModel");
+    qmlRegisterType<DeclarativeVariantInterpolator>(uri, 1, 0, "VariantInterpolator");
     registerUncreatable<TimePickerMode>(uri, "TimePickerMode");
 }
 

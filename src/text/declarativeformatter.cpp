@@ -198,7 +198,11 @@ DeclarativeFormatter::~DeclarativeFormatter() = default;
 void DeclarativeFormatter::updateHourMode()
 {
     const QVariant value = m_hourMode->value();
-    m_twelveHour = value.isValid() && value.toString() == QLatin1String("12");
+    const bool twelveHour = value.isValid() && value.toString() == QLatin1String("12");
+    if (twelveHour == m_twelveHour)
+        return;
+    m_twelveHour = twelveHour;
+    Q_EMIT twelveHourChanged();
 }
 
 // Building blocks ---------------------------------------------------------------------

@@ -16,6 +16,8 @@ class MGConfItem;
 class DeclarativeFormatter : public QObject
 {
     Q_OBJECT
+    // The device's clock shows 12 hours with am/pm: time pickers follow it live.
+    Q_PROPERTY(bool twelveHour READ twelveHour NOTIFY twelveHourChanged)
 
 public:
     enum FormatType {
@@ -54,6 +56,11 @@ public:
 
     // The most digits after the point that formatFileSize writes: all a double holds.
     static constexpr int MaxFileSizePrecision = 17;
+
+    bool twelveHour() const { return m_twelveHour; }
+
+Q_SIGNALS:
+    void twelveHourChanged();
 
 public Q_SLOTS:
     void updateHourMode();
