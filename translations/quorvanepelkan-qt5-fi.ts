@@ -504,5 +504,15 @@
         <extracomment>Section or time of the previous day</extracomment>
         <translation>Eilen</translation>
     </message>
+    <message id="quorvanepelkan-la-password">
+        <source>Password</source>
+        <extracomment>Label under a password field</extracomment>
+        <translation>Salasana</translation>
+    </message>
+    <message id="quorvanepelkan-ph-search">
+        <source>Search</source>
+        <extracomment>Placeholder of an empty search field</extracomment>
+        <translation>Hae</translation>
+    </message>
 </context>
 </TS>

@@ -504,5 +504,15 @@
         <extracomment>Section or time of the previous day</extracomment>
         <translation>Yesterday</translation>
     </message>
+    <message id="quorvanepelkan-la-password">
+        <source>Password</source>
+        <extracomment>Label under a password field</extracomment>
+        <translation>Password</translation>
+    </message>
+    <message id="quorvanepelkan-ph-search">
+        <source>Search</source>
+        <extracomment>Placeholder of an empty search field</extracomment>
+        <translation>Search</translation>
+    </message>
 </context>
 </TS>
