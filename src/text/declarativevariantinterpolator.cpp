@@ -76,7 +76,7 @@ void DeclarativeVariantInterpolator::setProgress(qreal progress)
         return;
     m_progress = progress;
     Q_EMIT progressChanged();
-    update();
+    update(true);
 }
 
 QVariant DeclarativeVariantInterpolator::interpolate(const QVariant &from, const QVariant &to, qreal progress)
@@ -118,7 +118,7 @@ QVariant DeclarativeVariantInterpolator::interpolate(const QVariant &from, const
     }
 }
 
-void DeclarativeVariantInterpolator::update()
+void DeclarativeVariantInterpolator::update(bool progressed)
 {
     QVariant value;
     if (!m_from.isValid() || !m_to.isValid()) {
@@ -126,9 +126,11 @@ void DeclarativeVariantInterpolator::update()
     } else {
         value = interpolate(m_from, m_to, m_progress);
         if (!value.isValid()) {
-            if (!m_warned)
+            // Only when progress moves: from and to are often set one after the other.
+            if (progressed && !m_warned) {
                 qmlWarning(this) << "cannot interpolate between " << m_from.typeName() << " and " << m_to.typeName();
-            m_warned = true;
+                m_warned = true;
+            }
             value = m_progress < 1 ? m_from : m_to;
         }
     }

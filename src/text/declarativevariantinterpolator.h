@@ -37,7 +37,7 @@ Q_SIGNALS:
     void valueChanged();
 
 private:
-    void update();
+    void update(bool progressed = false);
 
     QVariant m_from;
     QVariant m_to;

@@ -40,6 +40,8 @@ public:
     void setWrap(bool wrap);
 
     int count() const { return m_lines.size(); }
+    // Where line `row` lies (x, y, natural width, height); empty for a row that is not there.
+    Q_INVOKABLE QRectF lineRect(int row) const { return row >= 0 && row < m_lines.size() ? m_lines.at(row).rect : QRectF(); }
     bool truncated() const { return m_truncated; }
     qreal contentHeight() const { return m_contentHeight; }
     qreal contentWidth() const { return m_contentWidth; }
