@@ -390,13 +390,18 @@ void tst_DeclarativeFormatter::formatArticle()
 void tst_DeclarativeFormatter::hourModeFollowsConfiguration()
 {
     F formatter;
+    QSignalSpy hourModeChanged(&formatter, &F::twelveHourChanged);
     const QDateTime afternoon(Now.date(), QTime(14, 5));
     QCOMPARE(formatter.formatDate(afternoon, F::TimepointRelative), QStringLiteral("14:05"));
+    QVERIFY(!formatter.property("twelveHour").toBool());
     QVERIFY(ConfigFixture::write(HourModeKey, QStringLiteral("'12'")));
     QTRY_COMPARE(formatter.formatDate(afternoon, F::TimepointRelative), QStringLiteral("2:05 PM"));
     QCOMPARE(formatter.formatDate(afternoon, F::TimeValue), QStringLiteral("2:05 PM"));
+    QVERIFY(formatter.property("twelveHour").toBool());
+    QCOMPARE(hourModeChanged.count(), 1);
     QVERIFY(ConfigFixture::write(HourModeKey, QStringLiteral("'24'")));
     QTRY_COMPARE(formatter.formatDate(afternoon, F::TimepointRelative), QStringLiteral("14:05"));
+    QCOMPARE(hourModeChanged.count(), 2);
 }
 
 void tst_DeclarativeFormatter::trId_data()

@@ -9,16 +9,16 @@ import Quorvane.Pelkan.private 1.0 as Private
 Row {
     id: picker
 
-    property int mode: TimePickerMode.HoursAndMinutes
+    property int mode: Private.TimePickerMode.HoursAndMinutes
     property int hourMode: DateTime.DefaultHours
     property int hour: 0
     property int minute: 0
     property int second: 0
-    readonly property bool twelveHour: mode === TimePickerMode.HoursAndMinutes
+    readonly property bool twelveHour: mode === Private.TimePickerMode.HoursAndMinutes
                                        && (hourMode === DateTime.TwelveHours
                                            || (hourMode === DateTime.DefaultHours && Format.twelveHour))
     readonly property date time: new Date(2000, 0, 1, hour, minute, second)
-    readonly property string timeText: mode === TimePickerMode.MinutesAndSeconds
+    readonly property string timeText: mode === Private.TimePickerMode.MinutesAndSeconds
         ? _twoDigits(minute) + ":" + _twoDigits(second)
         : Format.formatDate(time, twelveHour ? Formatter.TimeValueTwelveHours : Formatter.TimeValueTwentyFourHours)
 
@@ -34,12 +34,12 @@ Row {
 
     // The wheels show the properties; turning a wheel sets them.
     Private.PickerColumn {
-        labels: picker.mode === TimePickerMode.MinutesAndSeconds ? picker._range(60, 0, true)
+        labels: picker.mode === Private.TimePickerMode.MinutesAndSeconds ? picker._range(60, 0, true)
               : picker.twelveHour ? ["12"].concat(picker._range(11, 1, false)) : picker._range(24, 0, true)
-        currentIndex: picker.mode === TimePickerMode.MinutesAndSeconds ? picker.minute
+        currentIndex: picker.mode === Private.TimePickerMode.MinutesAndSeconds ? picker.minute
                     : picker.twelveHour ? picker.hour % 12 : picker.hour
         onPicked: {
-            if (picker.mode === TimePickerMode.MinutesAndSeconds)
+            if (picker.mode === Private.TimePickerMode.MinutesAndSeconds)
                 picker.minute = index
             else
                 picker.hour = picker.twelveHour ? index + (picker.hour >= 12 ? 12 : 0) : index
@@ -47,9 +47,9 @@ Row {
     }
     Private.PickerColumn {
         labels: picker._range(60, 0, true)
-        currentIndex: picker.mode === TimePickerMode.MinutesAndSeconds ? picker.second : picker.minute
+        currentIndex: picker.mode === Private.TimePickerMode.MinutesAndSeconds ? picker.second : picker.minute
         onPicked: {
-            if (picker.mode === TimePickerMode.MinutesAndSeconds)
+            if (picker.mode === Private.TimePickerMode.MinutesAndSeconds)
                 picker.second = index
             else
                 picker.minute = index

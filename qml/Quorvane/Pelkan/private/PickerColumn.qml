@@ -6,6 +6,8 @@ import Quorvane.Pelkan 1.0
 ListView {
     id: column
 
+    signal picked(int index)
+
     property var labels: []
     readonly property real itemHeight: Theme.itemSizeSmall * 0.8
 
