@@ -2,6 +2,7 @@
 
 #include "declarativepreedittext.h"
 #include "declarativeunderline.h"
+#include "palette.h"
 #include "verticalautoscroll.h"
 
 #include <QQmlEngine>
@@ -11,6 +12,7 @@
 DeclarativeTextBaseItem::DeclarativeTextBaseItem(QQuickItem *parent)
     : QQuickItem(parent)
     , m_underline(new DeclarativeUnderline(this))
+    , m_palette(new Pelkan::Palette(this))
 {
     setAcceptedMouseButtons(Qt::LeftButton);
     setActiveFocusOnTab(false);

@@ -3,6 +3,7 @@
 #include <QPointer>
 #include <QQuickItem>
 
+namespace Pelkan { class Palette; }
 class DeclarativePreeditText;
 class DeclarativeUnderline;
 
@@ -12,7 +13,9 @@ class DeclarativeUnderline;
 // `underline`) below it and the `labelItem` under that; its implicit height follows.
 // It tracks the editor's focus (`focused`), whether there is anything in it counting the
 // keyboard's pending composition (`empty`), and the `errorHighlight` that the underline
-// shows. A tap outside the editor but inside the field gives the editor focus.
+// shows. Its `palette` (the theme's colours unless set) is what the look draws with, so
+// one field can be recoloured. A tap outside the editor but inside the field gives the
+// editor focus.
 class DeclarativeTextBaseItem : public QQuickItem
 {
     Q_OBJECT
@@ -21,6 +24,7 @@ class DeclarativeTextBaseItem : public QQuickItem
     Q_PROPERTY(QQuickItem *placeholderItem READ placeholderItem WRITE setPlaceholderItem NOTIFY placeholderItemChanged)
     Q_PROPERTY(QQuickItem *labelItem READ labelItem WRITE setLabelItem NOTIFY labelItemChanged)
     Q_PROPERTY(DeclarativeUnderline *underline READ underline CONSTANT)
+    Q_PROPERTY(Pelkan::Palette *palette READ palette CONSTANT)
     Q_PROPERTY(bool focused READ focused NOTIFY focusedChanged)
     Q_PROPERTY(bool empty READ empty NOTIFY emptyChanged)
     Q_PROPERTY(bool highlighted READ highlighted WRITE setHighlighted NOTIFY highlightedChanged)
@@ -44,6 +48,7 @@ public:
     QQuickItem *labelItem() const { return m_labelItem; }
     void setLabelItem(QQuickItem *item);
     DeclarativeUnderline *underline() const { return m_underline; }
+    Pelkan::Palette *palette() const { return m_palette; }
 
     bool focused() const { return m_focused; }
     bool empty() const { return m_empty; }
@@ -94,6 +99,7 @@ private:
     QPointer<QQuickItem> m_placeholderItem;
     QPointer<QQuickItem> m_labelItem;
     DeclarativeUnderline *m_underline;
+    Pelkan::Palette *m_palette;
     DeclarativePreeditText *m_preedit = nullptr;
     qreal m_padding[5] = { 0, 0, 0, 0, 0 };
     bool m_focused = false;

@@ -35,8 +35,8 @@ Private.TextBaseItem {
     editor: edit
     placeholderItem: placeholder
     labelItem: labelText
-    underline.color: Theme.rgba(Theme.primaryColor, 0.4)
-    underline.highlightColor: Theme.highlightColor
+    underline.color: Theme.rgba(palette.primaryColor, 0.4)
+    underline.highlightColor: palette.highlightColor
     underline.errorColor: "#ff4d4d"
     underline.lineWidth: Math.max(1, Math.round(Theme.pixelRatio))
     underline.focusLineWidth: Math.max(2, Math.round(2 * Theme.pixelRatio))
@@ -46,9 +46,9 @@ Private.TextBaseItem {
         objectName: "textEditor"
         focus: true
         wrapMode: TextEdit.Wrap
-        color: field.highlighted ? Theme.highlightColor : Theme.primaryColor
-        selectionColor: Theme.rgba(Theme.highlightColor, 0.4)
-        selectedTextColor: Theme.highlightColor
+        color: field.highlighted ? field.palette.highlightColor : field.palette.primaryColor
+        selectionColor: Theme.rgba(field.palette.highlightColor, 0.4)
+        selectedTextColor: field.palette.highlightColor
         font.pixelSize: Theme.fontSizeMedium
     }
 
@@ -56,7 +56,7 @@ Private.TextBaseItem {
         id: placeholder
         visible: field.empty
         text: field.placeholderText
-        color: field.focused ? Theme.secondaryHighlightColor : Theme.secondaryColor
+        color: field.focused ? field.palette.secondaryHighlightColor : field.palette.secondaryColor
         font: edit.font
         wrapMode: Text.Wrap
     }
@@ -65,7 +65,7 @@ Private.TextBaseItem {
         id: labelText
         visible: field.label !== ""
         text: field.label
-        color: field.errorHighlight ? "#ff4d4d" : field.focused ? Theme.secondaryHighlightColor : Theme.secondaryColor
+        color: field.errorHighlight ? "#ff4d4d" : field.focused ? field.palette.secondaryHighlightColor : field.palette.secondaryColor
         font.pixelSize: Theme.fontSizeSmall
         elide: Text.ElideRight
     }

@@ -60,8 +60,8 @@ Private.TextBaseItem {
     placeholderItem: placeholder
     labelItem: below
     errorHighlight: !input.acceptableInput
-    underline.color: Theme.rgba(Theme.primaryColor, 0.4)
-    underline.highlightColor: Theme.highlightColor
+    underline.color: Theme.rgba(palette.primaryColor, 0.4)
+    underline.highlightColor: palette.highlightColor
     underline.errorColor: "#ff4d4d"
     underline.lineWidth: Math.max(1, Math.round(Theme.pixelRatio))
     underline.focusLineWidth: Math.max(2, Math.round(2 * Theme.pixelRatio))
@@ -97,9 +97,9 @@ Private.TextBaseItem {
             width: Math.max(flick.width, implicitWidth)
             autoScroll: false
             focus: true
-            color: field.highlighted ? Theme.highlightColor : Theme.primaryColor
-            selectionColor: Theme.rgba(Theme.highlightColor, 0.4)
-            selectedTextColor: Theme.highlightColor
+            color: field.highlighted ? field.palette.highlightColor : field.palette.primaryColor
+            selectionColor: Theme.rgba(field.palette.highlightColor, 0.4)
+            selectedTextColor: field.palette.highlightColor
             font.pixelSize: Theme.fontSizeMedium
             onAccepted: field.accepted()
         }
@@ -109,7 +109,7 @@ Private.TextBaseItem {
         id: placeholder
         visible: field.empty
         text: field.placeholderText
-        color: field.focused ? Theme.secondaryHighlightColor : Theme.secondaryColor
+        color: field.focused ? field.palette.secondaryHighlightColor : field.palette.secondaryColor
         font: input.font
         elide: Text.ElideRight
         horizontalAlignment: input.effectiveHorizontalAlignment
@@ -123,7 +123,7 @@ Private.TextBaseItem {
             visible: field.label !== ""
             width: parent.width
             text: field.label
-            color: field.errorHighlight ? "#ff4d4d" : field.focused ? Theme.secondaryHighlightColor : Theme.secondaryColor
+            color: field.errorHighlight ? "#ff4d4d" : field.focused ? field.palette.secondaryHighlightColor : field.palette.secondaryColor
             font.pixelSize: Theme.fontSizeSmall
             elide: Text.ElideRight
         }
@@ -136,7 +136,7 @@ Private.TextBaseItem {
                 height: Theme.itemSizeSmall * 0.75
                 verticalAlignment: Text.AlignVCenter
                 text: modelData
-                color: tap.pressed ? Theme.highlightColor : Theme.primaryColor
+                color: tap.pressed ? field.palette.highlightColor : field.palette.primaryColor
                 font.pixelSize: Theme.fontSizeMedium
                 elide: Text.ElideRight
                 MouseArea {
