@@ -3,6 +3,7 @@
 #include "declarativepreedittext.h"
 #include "declarativeunderline.h"
 #include "palette.h"
+#include "theme.h"
 #include "verticalautoscroll.h"
 
 #include <QQmlEngine>
@@ -15,6 +16,27 @@ DeclarativeTextBaseItem::DeclarativeTextBaseItem(QQuickItem *parent)
     , m_palette(new Pelkan::Palette(this))
 {
     setAcceptedMouseButtons(Qt::LeftButton);
+    // The line's look follows the palette and the pixel ratio from here, without a binding
+    // per field; a field that sets its own underline colours sets them after this.
+    const auto lineColors = [this] {
+        QColor resting = m_palette->primaryColor();
+        resting.setAlphaF(0.4);
+        m_underline->setColor(resting);
+        m_underline->setHighlightColor(m_palette->highlightColor());
+    };
+    const auto lineWidths = [this] {
+        const qreal ratio = Pelkan::Theme::instance()->pixelRatio();
+        m_underline->setLineWidth(qMax<qreal>(1, qRound(ratio)));
+        m_underline->setFocusLineWidth(qMax<qreal>(2, qRound(2 * ratio)));
+    };
+    lineColors();
+    lineWidths();
+    m_underline->setErrorColor(QColor(0xff, 0x4d, 0x4d));
+    connect(m_palette, &Pelkan::Palette::primaryColorChanged, this, lineColors);
+    connect(m_palette, &Pelkan::Palette::highlightColorChanged, this, lineColors);
+    connect(Pelkan::Theme::instance(), &Pelkan::Theme::pixelRatioChanged, this, lineWidths);
+    themePaddings();
+    connect(Pelkan::Theme::instance(), &Pelkan::Theme::pixelRatioChanged, this, &DeclarativeTextBaseItem::themePaddings);
     setActiveFocusOnTab(false);
     connect(m_underline, &DeclarativeUnderline::lineWidthChanged, this, &QQuickItem::polish);
     connect(m_underline, &DeclarativeUnderline::focusLineWidthChanged, this, &QQuickItem::polish);
@@ -104,8 +126,27 @@ void DeclarativeTextBaseItem::setErrorHighlight(bool error)
     Q_EMIT errorHighlightChanged();
 }
 
+void DeclarativeTextBaseItem::themePaddings()
+{
+    const Pelkan::Theme *theme = Pelkan::Theme::instance();
+    const qreal themed[5] = { theme->horizontalPageMargin(), theme->horizontalPageMargin(),
+                              theme->paddingSmall(), theme->paddingMedium(), theme->paddingSmall() };
+    bool changed = false;
+    for (int which = 0; which < 5; ++which) {
+        if (!(m_paddingSet & (1u << which)) && m_padding[which] != themed[which]) {
+            m_padding[which] = themed[which];
+            changed = true;
+        }
+    }
+    if (changed) {
+        polish();
+        Q_EMIT paddingChanged();
+    }
+}
+
 void DeclarativeTextBaseItem::setPadding(int which, qreal value)
 {
+    m_paddingSet |= 1u << which;
     if (m_padding[which] == value)
         return;
     m_padding[which] = value;

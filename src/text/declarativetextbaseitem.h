@@ -11,7 +11,8 @@ class DeclarativeUnderline;
 // the look left to QML. It lays out the `contentItem` (the editor, or what holds it) at
 // the top inside the paddings, the `placeholderItem` over it, the underline (its own, see
 // `underline`) below it and the `labelItem` under that; its implicit height follows.
-// It tracks the editor's focus (`focused`), whether there is anything in it counting the
+// The paddings follow the theme (page margins at the sides) until set. It tracks the
+// editor's focus (`focused`), whether there is anything in it counting the
 // keyboard's pending composition (`empty`), and the `errorHighlight` that the underline
 // shows. Its `palette` (the theme's colours unless set) is what the look draws with, so
 // one field can be recoloured. A tap outside the editor but inside the field gives the
@@ -90,6 +91,7 @@ protected:
 
 private:
     void setPadding(int which, qreal value);
+    void themePaddings();
     void watchForLayout(QQuickItem *item);
     void updateFocused();
     void updateEmpty();
@@ -102,6 +104,7 @@ private:
     Pelkan::Palette *m_palette;
     DeclarativePreeditText *m_preedit = nullptr;
     qreal m_padding[5] = { 0, 0, 0, 0, 0 };
+    unsigned m_paddingSet = 0; // the paddings set from QML; the others follow the theme
     bool m_focused = false;
     bool m_empty = true;
     bool m_highlighted = false;

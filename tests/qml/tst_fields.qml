@@ -64,6 +64,22 @@ Item {
             compare(root.entered, [data.tag2])
         }
 
+        // Typing past the field's end scrolls the text so the cursor stays in the field.
+        function test_longText() {
+            plain.text = ""
+            mouseClick(plain, plain.width / 2, plain.topPadding + 4)
+            for (var i = 0; i < 40; ++i)
+                keyClick("w")
+            wait(500)
+            tryVerify(function() {
+                var x = plain._editor.mapToItem(plain, plain._editor.cursorRectangle.x, 0).x
+                return x > plain.leftPadding && x < plain.width - plain.rightPadding
+            })
+            verify(plain._editor.width > plain.width)
+            keyClick(Qt.Key_Home)
+            tryVerify(function() { return plain._editor.mapToItem(plain, 0, 0).x === plain.leftPadding })
+        }
+
         function test_validation() {
             plain.text = ""
             plain.validator = intOnly
@@ -80,6 +96,7 @@ Item {
 
         function test_suggestions() {
             search.text = ""
+            search._autoFill.remove("hi") // what the typing test may have left
             search._autoFill.insert("harbour")
             search._autoFill.insert("hamburg")
             search._autoFill.insert("oslo")

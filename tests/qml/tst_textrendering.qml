@@ -8,7 +8,7 @@ import Quorvane.Pelkan 1.0
 Rectangle {
     id: root
     width: 400
-    height: 300
+    height: 800 // no smaller than the files run after it: the test window keeps its size
     color: "black"
 
     Label {

@@ -12,9 +12,10 @@ Text {
     property int truncationMode: TruncationMode.None
     property int fadeDirection: effectiveHorizontalAlignment === Text.AlignRight ? OpacityRamp.RightToLeft
                                                                                 : OpacityRamp.LeftToRight
-    readonly property bool _fading: truncationMode === TruncationMode.Fade && _overflows
-    readonly property bool _overflows: wrapMode === Text.NoWrap ? contentWidth > width + 0.5
-                                                                : truncated || contentHeight > height + 0.5
+    // Only a fading label reads its size back: the others cost nothing for it.
+    readonly property bool _fading: truncationMode === TruncationMode.Fade
+                                    && (wrapMode === Text.NoWrap ? contentWidth > width + 0.5
+                                                                 : truncated || contentHeight > height + 0.5)
     // The lines as laid out, for the fade to find the last one; made only for multi-line
     // fading labels.
     property Private.TextLayoutModel _lines: null
@@ -22,11 +23,15 @@ Text {
     color: Theme.primaryColor
     font.pixelSize: Theme.fontSizeMedium
     elide: truncationMode === TruncationMode.Elide ? Text.ElideRight : Text.ElideNone
-    clip: _fading
 
+    // The layer and its effect are made the first time the label fades.
     on_FadingChanged: {
         if (_fading && wrapMode !== Text.NoWrap && !_lines)
             _lines = linesComponent.createObject(label)
+        if (_fading && !layer.effect)
+            layer.effect = fadeComponent
+        layer.enabled = _fading
+        clip = _fading
     }
 
     Component {
@@ -39,16 +44,18 @@ Text {
         }
     }
 
-    layer.enabled: _fading
-    layer.effect: Private.FadeEffect {
-        direction: label.fadeDirection
-        // Only the last line that shows fades: everything above it stays whole.
-        lineTop: {
-            if (label.wrapMode === Text.NoWrap || !label._lines || label._lines.count < 2)
-                return 0
-            var shown = Math.max(1, Math.min(label.lineCount, label._lines.count))
-            return Math.min(1, label._lines.lineRect(shown - 1).y / Math.max(1, label.height))
+    Component {
+        id: fadeComponent
+        Private.FadeEffect {
+            direction: label.fadeDirection
+            // Only the last line that shows fades: everything above it stays whole.
+            lineTop: {
+                if (label.wrapMode === Text.NoWrap || !label._lines || label._lines.count < 2)
+                    return 0
+                var shown = Math.max(1, Math.min(label.lineCount, label._lines.count))
+                return Math.min(1, label._lines.lineRect(shown - 1).y / Math.max(1, label.height))
+            }
+            rampLength: Math.min(1, Theme.paddingLarge * 4 / Math.max(1, direction < OpacityRamp.TopToBottom ? label.width : label.height))
         }
-        rampLength: Math.min(1, Theme.paddingLarge * 4 / Math.max(1, direction < OpacityRamp.TopToBottom ? label.width : label.height))
     }
 }

@@ -25,21 +25,11 @@ Private.TextBaseItem {
 
     width: parent ? parent.width : implicitWidth
     implicitWidth: Theme.itemSizeExtraLarge * 3
-    leftPadding: Theme.horizontalPageMargin
-    rightPadding: Theme.horizontalPageMargin
-    topPadding: Theme.paddingSmall
-    bottomPadding: Theme.paddingMedium
-    labelSpacing: Theme.paddingSmall
     opacity: enabled ? 1 : 0.4
 
     editor: edit
     placeholderItem: placeholder
     labelItem: labelText
-    underline.color: Theme.rgba(palette.primaryColor, 0.4)
-    underline.highlightColor: palette.highlightColor
-    underline.errorColor: "#ff4d4d"
-    underline.lineWidth: Math.max(1, Math.round(Theme.pixelRatio))
-    underline.focusLineWidth: Math.max(2, Math.round(2 * Theme.pixelRatio))
 
     TextEdit {
         id: edit

@@ -48,27 +48,21 @@ Private.TextBaseItem {
 
     width: parent ? parent.width : implicitWidth
     implicitWidth: Theme.itemSizeExtraLarge * 3
-    leftPadding: Theme.horizontalPageMargin
-    rightPadding: Theme.horizontalPageMargin
-    topPadding: Theme.paddingSmall
-    bottomPadding: Theme.paddingMedium
-    labelSpacing: Theme.paddingSmall
     opacity: enabled ? 1 : 0.4
 
     editor: input
-    contentItem: flick
     placeholderItem: placeholder
-    labelItem: below
+    labelItem: labelText
     errorHighlight: !input.acceptableInput
-    underline.color: Theme.rgba(palette.primaryColor, 0.4)
-    underline.highlightColor: palette.highlightColor
-    underline.errorColor: "#ff4d4d"
-    underline.lineWidth: Math.max(1, Math.round(Theme.pixelRatio))
-    underline.focusLineWidth: Math.max(2, Math.round(2 * Theme.pixelRatio))
 
     onAutoFillKeyChanged: {
-        if (autoFillKey !== "" && !_autoFill)
+        if (autoFillKey !== "" && !_autoFill) {
             _autoFill = autoFillComponent.createObject(field)
+            var below = belowComponent.createObject(field)
+            labelText.parent = below
+            labelText.width = Qt.binding(function() { return below.width })
+            labelItem = below
+        }
         if (_autoFill)
             _autoFill.key = autoFillKey
     }
@@ -81,27 +75,46 @@ Private.TextBaseItem {
         }
     }
 
-    Flickable {
-        id: flick
-        interactive: false
-        clip: contentWidth > width
-        contentWidth: input.width
-        contentHeight: height
-        flickableDirection: Flickable.HorizontalFlick
-        HorizontalAutoScroll.margin: Theme.paddingSmall
+    TextInput {
+        id: input
+        objectName: "textEditor"
+        // The field scrolls the text (animated, with the cursor) once it no longer fits.
+        autoScroll: false
+        focus: true
+        color: field.highlighted ? field.palette.highlightColor : field.palette.primaryColor
+        selectionColor: Theme.rgba(field.palette.highlightColor, 0.4)
+        selectedTextColor: field.palette.highlightColor
+        font.pixelSize: Theme.fontSizeMedium
+        onAccepted: field.accepted()
+        onTextChanged: field._checkFits()
+        onWidthChanged: field._checkFits()
+    }
 
-        TextInput {
-            id: input
-            objectName: "textEditor"
-            // As wide as the text, so that the flickable (not the input) scrolls it.
-            width: Math.max(flick.width, implicitWidth)
-            autoScroll: false
-            focus: true
-            color: field.highlighted ? field.palette.highlightColor : field.palette.primaryColor
-            selectionColor: Theme.rgba(field.palette.highlightColor, 0.4)
-            selectedTextColor: field.palette.highlightColor
-            font.pixelSize: Theme.fontSizeMedium
-            onAccepted: field.accepted()
+    // Most fields never hold more than fits: the flickable that scrolls the text sideways
+    // is made for the first that does.
+    property Item _scroller: null
+    function _checkFits() {
+        if (!_scroller && input.text !== "" && input.width > 0 && input.implicitWidth > input.width)
+            _makeScroller()
+    }
+    function _makeScroller() {
+        var scroller = scrollerComponent.createObject(field)
+        input.parent = scroller.contentItem
+        input.x = 0
+        input.y = 0
+        input.width = Qt.binding(function() { return Math.max(scroller.width, input.implicitWidth) })
+        contentItem = scroller
+        _scroller = scroller
+    }
+    Component {
+        id: scrollerComponent
+        Flickable {
+            interactive: false
+            clip: true
+            contentWidth: input.width
+            contentHeight: height
+            flickableDirection: Flickable.HorizontalFlick
+            HorizontalAutoScroll.margin: Theme.paddingSmall
         }
     }
 
@@ -115,36 +128,39 @@ Private.TextBaseItem {
         horizontalAlignment: input.effectiveHorizontalAlignment
     }
 
-    Column {
-        id: below
-        visible: field.label !== "" || suggestionList.count > 0
+    Text {
+        id: labelText
+        visible: field.label !== ""
+        text: field.label
+        color: field.errorHighlight ? "#ff4d4d" : field.focused ? field.palette.secondaryHighlightColor : field.palette.secondaryColor
+        font.pixelSize: Theme.fontSizeSmall
+        elide: Text.ElideRight
+    }
 
-        Text {
-            visible: field.label !== ""
-            width: parent.width
-            text: field.label
-            color: field.errorHighlight ? "#ff4d4d" : field.focused ? field.palette.secondaryHighlightColor : field.palette.secondaryColor
-            font.pixelSize: Theme.fontSizeSmall
-            elide: Text.ElideRight
-        }
-
-        Repeater {
-            id: suggestionList
-            model: field.focused && field._autoFill ? field._autoFill.suggestions : null
-            Text {
-                width: below.width
-                height: Theme.itemSizeSmall * 0.75
-                verticalAlignment: Text.AlignVCenter
-                text: modelData
-                color: tap.pressed ? field.palette.highlightColor : field.palette.primaryColor
-                font.pixelSize: Theme.fontSizeMedium
-                elide: Text.ElideRight
-                MouseArea {
-                    id: tap
-                    anchors.fill: parent
-                    onClicked: {
-                        input.text = modelData
-                        input.cursorPosition = input.length
+    // Made with the auto-fill, for the few fields that remember: the label and the
+    // suggestions under it, in one column below the line.
+    Component {
+        id: belowComponent
+        Column {
+            visible: labelText.visible || suggestionList.count > 0
+            Repeater {
+                id: suggestionList
+                model: field.focused && field._autoFill ? field._autoFill.suggestions : null
+                Text {
+                    width: parent.width
+                    height: Theme.itemSizeSmall * 0.75
+                    verticalAlignment: Text.AlignVCenter
+                    text: modelData
+                    color: tap.pressed ? field.palette.highlightColor : field.palette.primaryColor
+                    font.pixelSize: Theme.fontSizeMedium
+                    elide: Text.ElideRight
+                    MouseArea {
+                        id: tap
+                        anchors.fill: parent
+                        onClicked: {
+                            input.text = modelData
+                            input.cursorPosition = input.length
+                        }
                     }
                 }
             }
