@@ -29,7 +29,7 @@ int main(int argc, char *argv[])
                                         QStringLiteral("file"));
     parser.addOption(screenshot);
     const QCommandLineOption page(QStringLiteral("page"),
-                                  QStringLiteral("Open on <page>: home, theme, images, orientation, format, gestures, cover, text, dialog, lists."),
+                                  QStringLiteral("Open on <page>: home, theme, images, orientation, format, gestures, cover, form, dialog, lists."),
                                   QStringLiteral("page"), QStringLiteral("home"));
     parser.addOption(page);
     parser.process(app);

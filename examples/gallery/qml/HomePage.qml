@@ -10,7 +10,7 @@ Page {
         { name: "theme", title: "Theme" }, { name: "images", title: "Images" },
         { name: "orientation", title: "Orientation" }, { name: "format", title: "Formatting" },
         { name: "gestures", title: "Gestures" }, { name: "cover", title: "Cover" },
-        { name: "text", title: "Text input" }, { name: "lists", title: "Lists and menus" }
+        { name: "form", title: "Forms and controls" }, { name: "lists", title: "Lists and menus" }
     ]
 
     function openDialog(operationType) {
@@ -39,6 +39,8 @@ Page {
                 onClicked: {
                     if (modelData.name === "lists")
                         page.pageStack.push(Qt.resolvedUrl("ListsPage.qml"))
+                    else if (modelData.name === "form")
+                        page.pageStack.push(Qt.resolvedUrl("FormPage.qml"))
                     else
                         page.pageStack.push(Qt.resolvedUrl("SubjectPage.qml"),
                                             { "name": modelData.name, "title": modelData.title,

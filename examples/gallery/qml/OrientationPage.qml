@@ -57,11 +57,12 @@ Flickable {
 
         Repeater {
             model: [1, 2, 4, 8]
-            ToggleRow {
+            TextSwitch {
                 width: column.width
+                automaticCheck: false
                 text: page.names[modelData]
                 checked: applicationWindow && (applicationWindow.allowedOrientations & modelData)
-                onToggled: {
+                onClicked: {
                     var allowed = applicationWindow.allowedOrientations ^ modelData
                     // The window refuses an empty set; keep the last one ticked.
                     if (allowed !== 0)
@@ -70,11 +71,12 @@ Flickable {
             }
         }
 
-        ToggleRow {
+        TextSwitch {
             width: column.width
+            automaticCheck: false
             text: "Lock the current orientation"
             checked: applicationWindow && applicationWindow._orientationLocked
-            onToggled: applicationWindow._orientationLocked = !applicationWindow._orientationLocked
+            onClicked: applicationWindow._orientationLocked = !applicationWindow._orientationLocked
         }
 
         SectionHeader { text: "Device orientation" }

@@ -20,7 +20,6 @@ Page {
             case "format": return "FormatPage.qml"
             case "gestures": return "GesturesPage.qml"
             case "cover": return "CoverPage.qml"
-            case "text": return "TextPage.qml"
             default: return "ThemePage.qml"
             }
         }

@@ -26,8 +26,9 @@ ApplicationWindow {
     Component.onCompleted: {
         if (startPage === "dialog")
             pageStack.currentPage.openDialog(PageStackAction.Immediate)
-        else if (startPage === "lists")
-            pageStack.push(Qt.resolvedUrl("ListsPage.qml"), {}, PageStackAction.Immediate)
+        else if (startPage === "lists" || startPage === "form")
+            pageStack.push(Qt.resolvedUrl(startPage === "lists" ? "ListsPage.qml" : "FormPage.qml"), {},
+                           PageStackAction.Immediate)
         else if (startPage !== "home")
             pageStack.push(Qt.resolvedUrl("SubjectPage.qml"), { "name": startPage, "application": app },
                            PageStackAction.Immediate)
