@@ -34,11 +34,11 @@ Rectangle {
         name: "TextRendering"
         when: windowShown
 
-        // The brightest pixel in a band of columns of the label.
-        function brightest(image, from, to) {
+        // The brightest pixel in a band of columns of the label, in rows top..bottom.
+        function brightest(image, from, to, top, bottom) {
             var best = 0
             for (var x = Math.floor(from); x < to; ++x)
-                for (var y = 0; y < label.height; ++y)
+                for (var y = Math.floor(top); y < bottom; ++y)
                     best = Math.max(best, image.red(x, y))
             return best
         }
@@ -48,17 +48,25 @@ Rectangle {
                 { tag: "fits: nothing fades", text: "MMMM", mode: TruncationMode.Fade, faded: false },
                 { tag: "too long: the end fades", text: "MMMMMMMMMMMMMMMMMMMM", mode: TruncationMode.Fade, faded: true },
                 { tag: "too long, eliding", text: "MMMMMMMMMMMMMMMMMMMM", mode: TruncationMode.Elide, faded: false },
+                { tag: "two of three lines: the second fades", text: "MMMMMMMMMMMMMMMMMMMMMMMMMMMMMMMMMMMMMMMMMMMMMMMMMMMMMMMMMMMMM",
+                  mode: TruncationMode.Fade, lines: 2, faded: true },
             ]
         }
 
         function test_fade(data) {
             label.truncationMode = data.mode
+            label.wrapMode = data.lines ? Text.Wrap : Text.NoWrap
+            label.maximumLineCount = data.lines || 1
             label.text = data.text
             waitForRendering(label)
             var image = grabImage(root)
             var inked = Math.min(label.width, label.contentWidth)
-            var start = brightest(image, 0, inked * 0.2)
-            var end = brightest(image, inked * 0.92, inked - 1)
+            var line = label.height / (data.lines || 1)
+            var lastTop = label.height - line
+            if (data.lines) // the lines above the last stay whole to their end
+                verify(brightest(image, inked * 0.92, inked - 1, 0, lastTop) > 200)
+            var start = brightest(image, 0, inked * 0.2, lastTop, label.height)
+            var end = brightest(image, inked * 0.92, inked - 1, lastTop, label.height)
             verify(start > 200, "start " + start)
             if (data.faded)
                 verify(end < start * 0.4, "end " + end + " against " + start)
