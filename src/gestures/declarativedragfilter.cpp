@@ -1,5 +1,7 @@
 #include "declarativedragfilter.h"
 
+#include "declarativepagenavigation.h"
+
 #include <QQuickItem>
 
 DeclarativeDragFilter::DeclarativeDragFilter(QObject *parent)
@@ -26,6 +28,25 @@ void DeclarativeDragFilter::setEnabled(bool enabled)
         return;
     m_enabled = enabled;
     Q_EMIT enabledChanged();
+}
+
+void DeclarativeDragFilter::setReleasedNavigation(int navigation)
+{
+    if (navigation == m_releasedNavigation)
+        return;
+    m_releasedNavigation = navigation;
+    Q_EMIT releasedNavigationChanged();
+}
+
+int DeclarativeDragFilter::released(QQuickItem *item, const QQuickItem *boundary, Qt::Orientation orientation)
+{
+    int released = DeclarativePageNavigation::Back | DeclarativePageNavigation::Forward;
+    for (; item && item != boundary; item = item->parentItem()) {
+        auto filter = qobject_cast<DeclarativeDragFilter *>(qmlAttachedPropertiesObject<DeclarativeDragFilter>(item, false));
+        if (filter && filter->enabled() && (filter->orientations() & orientation))
+            released &= filter->releasedNavigation();
+    }
+    return released;
 }
 
 Qt::Orientations DeclarativeDragFilter::claimed(QQuickItem *item, const QQuickItem *boundary)

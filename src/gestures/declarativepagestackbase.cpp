@@ -123,6 +123,8 @@ bool DeclarativePageStackBase::childMouseEventFilter(QQuickItem *item, QEvent *e
     case QEvent::MouseButtonPress:
         // A drag the item under the finger claims for itself is not a swipe.
         m_claimedByChild = DeclarativeDragFilter::claimed(item, this);
+        m_releasedByChild = DeclarativeDragFilter::released(
+                item, this, m_navigationStyle == DeclarativePageNavigation::Vertical ? Qt::Vertical : Qt::Horizontal);
         return handleMouse(static_cast<QMouseEvent *>(event));
     case QEvent::MouseButtonRelease:
     case QEvent::MouseMove:
@@ -206,11 +208,17 @@ bool DeclarativePageStackBase::handleMove(QPointF pos)
         if (!m_mouseGrabbed && !m_noGrabbing)
             _grabMouse();
     } else {
-        if (m_claimedByChild & (vertical ? Qt::Vertical : Qt::Horizontal))
-            return false;
         const int threshold = int(QGuiApplication::styleHints()->startDragDistance() * 1.5);
         const qreal dx = pos.x() - m_pressPosition.x();
         const qreal dy = pos.y() - m_pressPosition.y();
+        if (m_claimedByChild & (vertical ? Qt::Vertical : Qt::Horizontal)) {
+            // Claimed, unless the child gives this way back (a view at its first item).
+            const qreal along = vertical ? qAbs(dy) : dx;
+            const int way = along > 0 ? DeclarativePageNavigation::Back
+                          : along < 0 ? DeclarativePageNavigation::Forward : 0;
+            if (!(way & m_releasedByChild))
+                return false;
+        }
         qCDebug(lcPelkanPageStackLog) << "FlickDifference x:" << dx << "y:" << dy;
 
         if (qAbs(dy) > qAbs(dx) && !vertical && qAbs(dy) > threshold) {

@@ -129,6 +129,7 @@ private:
     QPointF m_pressWindowPosition;
     ulong m_pressTimestamp = 0;
     Qt::Orientations m_claimedByChild; // by a DragFilter under the press
+    int m_releasedByChild = 0; // the directions that claim gives back (PageNavigation flags)
     QPointer<QQuickItem> m_currentContainer;
     QPointer<QQuickItem> m_currentPage;
     QHash<QString, QString> m_importCache;
