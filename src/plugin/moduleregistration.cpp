@@ -30,6 +30,8 @@
 #include "declarativevisibilitycull.h"
 #include "dragdetectoritem.h"
 #include "remorsecache.h"
+#include "slide.h"
+#include "slideable.h"
 #include "declarativewindow.h"
 #include "formattingproxymodel.h"
 #include "minversemousearea.h"
@@ -139,6 +141,8 @@ void registerPrivateModule(const char *uri)
     registerUncreatable<RemorseCache>(uri, "RemorseCache");
     qmlRegisterType<BlurEffect>(uri, 1, 0, "BlurEffect");
     qmlRegisterType<AutoScrollController>(uri, 1, 0, "AutoScrollController");
+    registerUncreatable<Slide>(uri, "Slide");
+    qmlRegisterType<Slideable>(uri, 1, 0, "SlideableBase");
     qmlRegisterType<AutoFill>(uri, 1, 0, "AutoFill");
     qmlRegisterType<StringListModel>(uri, 1, 0, "StringListModel");
     qmlRegisterType<DeclarativeVariantInterpolator>(uri, 1, 0, "VariantInterpolator");

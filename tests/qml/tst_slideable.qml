@@ -1,0 +1,195 @@
+import QtQuick 2.6
+import QtQuick.Window 2.2
+import QtTest 1.2
+import Quorvane.Pelkan 1.0
+import Quorvane.Pelkan.private 1.0 as Private
+import PelkanTest 1.0
+
+// Sliding views with real drags: where a release settles, the joined ends, the items the
+// cache keeps alive (counted), the attached values during a slide, tabs, and which of
+// the view and the page stack takes a swipe.
+Item {
+    id: root
+    width: 400
+    height: 800
+
+    property int made: 0
+    property int gone: 0
+
+    Private.SlideableBase {
+        id: view
+        width: 400
+        height: 300
+        model: 100
+        delegate: Rectangle {
+            // What the view attaches, read back by the test.
+            readonly property var slide: ({ index: Private.Slide.index, exposed: Private.Slide.exposed,
+                                            isCurrent: Private.Slide.isCurrent, offset: Private.Slide.offset,
+                                            view: Private.Slide.view, forward: Private.Slide.forward,
+                                            backward: Private.Slide.backward })
+            color: index % 2 ? "#333" : "#555"
+            Component.onCompleted: ++root.made
+            Component.onDestruction: ++root.gone
+            MouseArea { anchors.fill: parent } // content that takes presses
+        }
+    }
+
+    TabView {
+        id: tabs
+        y: 320
+        height: 200
+        model: ["One", "Two", "Three"]
+        delegate: Item {}
+    }
+
+    ApplicationWindow {
+        id: app
+        y: 540
+        width: 400
+        height: 260
+    }
+
+    Component {
+        id: pageWithView
+        Page {
+            property alias view: inner
+            Private.SlideableBase {
+                id: inner
+                anchors.fill: parent
+                model: 3
+                delegate: Item {}
+            }
+        }
+    }
+
+    TestCase {
+        name: "Slideable"
+        when: windowShown
+
+        function drag(target, fromX, toX, y, steps, pace, beforeRelease) {
+            mousePress(target, fromX, y)
+            for (var i = 1; i <= steps; ++i)
+                mouseMove(target, fromX + (toX - fromX) * i / steps, y, pace)
+            if (beforeRelease)
+                beforeRelease()
+            mouseRelease(target, toX, y, Qt.LeftButton, Qt.NoModifier, pace)
+        }
+
+        function init() {
+            view.loops = false
+            view.cacheSize = 2
+            view.moveTo(5, TabViewAction.Immediate)
+        }
+
+        function test_settle_data() {
+            return [
+                { tag: "slow, past half: next", from: 350, to: 100, pace: 40, index: 6 },
+                { tag: "slow, short of half: back", from: 350, to: 250, pace: 40, index: 5 },
+                { tag: "quick flick, short: next", from: 350, to: 280, pace: 5, index: 6 },
+                { tag: "quick flick back", from: 50, to: 120, pace: 5, index: 4 },
+                { tag: "loops: before the first is the last", start: 0, loops: true, from: 50, to: 300, pace: 40, index: 99 },
+                { tag: "no loop: the first stays", start: 0, from: 50, to: 300, pace: 40, index: 0 },
+            ]
+        }
+
+        function test_settle(data) {
+            view.loops = !!data.loops
+            if (data.start !== undefined)
+                view.moveTo(data.start, TabViewAction.Immediate)
+            drag(view, data.from, data.to, 150, 10, data.pace)
+            tryCompare(view, "moving", false)
+            compare(view.currentIndex, data.index)
+            compare(view.position, data.index)
+            compare(view.currentItem.x, 0)
+        }
+
+        // Only the current item and cacheSize neighbours live, however far the view goes.
+        function test_cache_data() {
+            return [
+                { tag: "none", cache: 0, alive: 1 },
+                { tag: "two", cache: 2, alive: 3 },
+                { tag: "five", cache: 5, alive: 6 },
+            ]
+        }
+
+        function test_cache(data) {
+            view.cacheSize = data.cache
+            view.moveTo(50, TabViewAction.Immediate)
+            compare(view.aliveCount, data.alive)
+            drag(view, 350, 100, 150, 10, 40)
+            tryCompare(view, "moving", false)
+            compare(view.currentIndex, 51)
+            compare(view.aliveCount, data.alive)
+            tryCompare(root, "made", root.gone + data.alive) // released ones are destroyed
+            verify(view.itemAt(51) !== null)
+            compare(view.itemAt(51 + Math.ceil(data.cache / 2) + 1), null)
+        }
+
+        function test_attachedDuringSlide() {
+            var current = view.currentItem
+            drag(view, 350, 250, 150, 5, 40, function() {
+                verify(view.dragging)
+                var next = current.slide.forward
+                verify(next !== null)
+                compare(next.slide.index, 6)
+                verify(next.slide.exposed)
+                verify(current.slide.isCurrent && !next.slide.isCurrent)
+                verify(current.slide.offset < 0 && current.slide.offset > -1, current.slide.offset)
+                fuzzyCompare(next.slide.offset, current.slide.offset + 1, 1e-9)
+                compare(next.slide.view, view)
+                compare(next.slide.backward, current)
+            })
+            tryCompare(view, "moving", false)
+        }
+
+        function test_tabs_data() {
+            return [
+                { tag: "tap the third title", act: function() { mouseClick(tabs, 400 * 5 / 6, 20) }, index: 2 },
+                { tag: "swipe to the second", act: function() { drag(tabs, 350, 100, tabs.view.y + tabs.view.height / 2, 10, 40) }, index: 1 },
+            ]
+        }
+
+        function test_tabs(data) {
+            tabs.moveTo(0, TabViewAction.Immediate)
+            data.act()
+            tryCompare(tabs, "moving", false)
+            compare(tabs.currentIndex, data.index)
+            compare(tabs.view.aliveCount, 1) // lazily made, one at a time
+        }
+
+        // At the view's first item the back swipe is the page stack's; further in, the view's.
+        function test_backSwipe_data() {
+            return [
+                { tag: "first item: the page goes", index: 0, depth: 1, viewIndex: 0 },
+                { tag: "second item: the view slides", index: 1, depth: 2, viewIndex: 0 },
+            ]
+        }
+
+        function test_backSwipe(data) {
+            var stack = app.pageStack
+            stack.clear()
+            stack.push(pageWithView, {}, PageStackAction.Immediate)
+            var page = stack.push(pageWithView, {}, PageStackAction.Immediate)
+            page.view.moveTo(data.index, TabViewAction.Immediate)
+            var inner = page.view
+            drag(stack, 20, 300, 130, 12, 16)
+            tryCompare(stack, "busy", false)
+            compare(stack.depth, data.depth)
+            if (data.depth === 2) {
+                tryCompare(inner, "moving", false)
+                compare(inner.currentIndex, data.viewIndex)
+            }
+        }
+
+        function test_cancelledTouch() {
+            var touch = touchEvent(view)
+            touch.press(0, view, 350, 150).commit()
+            for (var i = 1; i <= 10; ++i)
+                touch.move(0, view, 350 - 30 * i, 150).commit()
+            verify(view.dragging)
+            TouchSystem.cancel(root.Window.window)
+            tryCompare(view, "moving", false)
+            compare(view.currentIndex, 6) // moved 300 of 400: the nearer item
+        }
+    }
+}
