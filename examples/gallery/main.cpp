@@ -4,6 +4,7 @@
 //   pelkan-gallery --screenshot out.png  renders it once and saves a picture
 //   pelkan-gallery --page orientation    opens on a subject over the home page
 
+#include "photos.h"
 #include "screenshotter.h"
 
 #include <QCommandLineParser>
@@ -29,7 +30,7 @@ int main(int argc, char *argv[])
                                         QStringLiteral("file"));
     parser.addOption(screenshot);
     const QCommandLineOption page(QStringLiteral("page"),
-                                  QStringLiteral("Open on <page>: home, theme, images, orientation, format, gestures, cover, form, dialog, lists."),
+                                  QStringLiteral("Open on <page>: home, theme, images, orientation, format, gestures, cover, form, dialog, lists, photos, tabs."),
                                   QStringLiteral("page"), QStringLiteral("home"));
     parser.addOption(page);
     parser.process(app);
@@ -48,7 +49,8 @@ int main(int argc, char *argv[])
             QCoreApplication::installTranslator(&localised);
     }
 
-    engine.setInitialProperties({ { QStringLiteral("startPage"), parser.value(page) } });
+    engine.setInitialProperties({ { QStringLiteral("startPage"), parser.value(page) },
+                                  { QStringLiteral("photos"), samplePhotos() } });
     engine.load(QUrl(QStringLiteral("qrc:/gallery/main.qml")));
     // The application window makes the window it lives in.
     auto root = engine.rootObjects().isEmpty() ? nullptr : qobject_cast<QQuickItem *>(engine.rootObjects().first());

@@ -10,7 +10,8 @@ Page {
         { name: "theme", title: "Theme" }, { name: "images", title: "Images" },
         { name: "orientation", title: "Orientation" }, { name: "format", title: "Formatting" },
         { name: "gestures", title: "Gestures" }, { name: "cover", title: "Cover" },
-        { name: "form", title: "Forms and controls" }, { name: "lists", title: "Lists and menus" }
+        { name: "form", title: "Forms and controls" },
+        { name: "photos", title: "Photo slideshow" }, { name: "tabs", title: "Tabs" }, { name: "lists", title: "Lists and menus" }
     ]
 
     function openDialog(operationType) {
@@ -41,6 +42,10 @@ Page {
                         page.pageStack.push(Qt.resolvedUrl("ListsPage.qml"))
                     else if (modelData.name === "form")
                         page.pageStack.push(Qt.resolvedUrl("FormPage.qml"))
+                    else if (modelData.name === "photos")
+                        page.pageStack.push(Qt.resolvedUrl("PhotosPage.qml"), { "photos": page._window.photos })
+                    else if (modelData.name === "tabs")
+                        page.pageStack.push(Qt.resolvedUrl("TabsPage.qml"))
                     else
                         page.pageStack.push(Qt.resolvedUrl("SubjectPage.qml"),
                                             { "name": modelData.name, "title": modelData.title,

@@ -8,8 +8,10 @@ ApplicationWindow {
     id: app
 
     // Which subject the gallery opens on, over the home page: theme, images, orientation,
-    // format, gestures, cover, text, dialog, lists; "home" for none.
+    // format, gestures, cover, form, dialog, lists, photos, tabs; "home" for none.
     property string startPage: "home"
+    // Pictures on disk for the slideshow (set by the program).
+    property var photos: []
     property int played: 0
     property int skipped: 0
 
@@ -26,9 +28,10 @@ ApplicationWindow {
     Component.onCompleted: {
         if (startPage === "dialog")
             pageStack.currentPage.openDialog(PageStackAction.Immediate)
-        else if (startPage === "lists" || startPage === "form")
-            pageStack.push(Qt.resolvedUrl(startPage === "lists" ? "ListsPage.qml" : "FormPage.qml"), {},
-                           PageStackAction.Immediate)
+        else if (["lists", "form", "photos", "tabs"].indexOf(startPage) >= 0)
+            pageStack.push(Qt.resolvedUrl({ "lists": "ListsPage.qml", "form": "FormPage.qml",
+                                            "photos": "PhotosPage.qml", "tabs": "TabsPage.qml" }[startPage]),
+                           startPage === "photos" ? { "photos": photos } : {}, PageStackAction.Immediate)
         else if (startPage !== "home")
             pageStack.push(Qt.resolvedUrl("SubjectPage.qml"), { "name": startPage, "application": app },
                            PageStackAction.Immediate)
