@@ -347,7 +347,12 @@ void Slideable::releaseItem(int index)
         return;
     item->setVisible(false);
     item->setParentItem(nullptr);
-    item->deleteLater();
+    // At once, so that no more than the cache is ever alive; later only if a finger is
+    // still on it (the event being delivered refers to it).
+    if (window() && window()->mouseGrabberItem() && item->isAncestorOf(window()->mouseGrabberItem()))
+        item->deleteLater();
+    else
+        delete item;
 }
 
 void Slideable::refresh()
