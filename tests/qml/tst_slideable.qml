@@ -42,6 +42,19 @@ Item {
         delegate: Item {}
     }
 
+    // The same three items from each kind of source.
+    Private.StringListModel { id: strings; strings: ["a", "b", "c"] }
+    Component { id: textDelegate; Text { text: modelData } }
+    Private.SlideableBase { id: fromNumber; y: 800; width: 100; height: 50; model: 3; delegate: textDelegate }
+    Private.SlideableBase { id: fromList; y: 800; width: 100; height: 50; model: ["a", "b", "c"]; delegate: textDelegate }
+    Private.SlideableBase { id: fromModel; y: 800; width: 100; height: 50; model: strings; delegate: textDelegate }
+    Private.SlideableBase {
+        id: fromChildren; y: 800; width: 100; height: 50
+        Text { text: "a" }
+        Text { text: "b" }
+        Text { text: "c" }
+    }
+
     ApplicationWindow {
         id: app
         y: 540
@@ -179,6 +192,36 @@ Item {
                 tryCompare(inner, "moving", false)
                 compare(inner.currentIndex, data.viewIndex)
             }
+        }
+
+        function test_sources_data() {
+            return [
+                { tag: "number", view: fromNumber, second: "1" },
+                { tag: "list", view: fromList, second: "b" },
+                { tag: "item model", view: fromModel, second: "b" },
+                { tag: "children", view: fromChildren, second: "b" },
+            ]
+        }
+
+        function test_sources(data) {
+            compare(data.view.count, 3)
+            data.view.moveTo(1, TabViewAction.Immediate)
+            compare(data.view.currentItem.text, data.second)
+            compare(data.view.currentItem.x, 0)
+            compare(data.view.itemAt(2).x, data.view.width)
+            data.view.moveTo(0, TabViewAction.Immediate)
+        }
+
+        // Rows that come and go make the items again for the rows now there.
+        function test_modelEdits() {
+            fromModel.moveTo(2, TabViewAction.Immediate)
+            strings.remove(2)
+            compare(fromModel.count, 2)
+            compare(fromModel.currentIndex, 1)
+            compare(fromModel.currentItem.text, "b")
+            strings.insert(0, "z")
+            compare(fromModel.itemAt(0).text, "z")
+            strings.strings = ["a", "b", "c"]
         }
 
         function test_cancelledTouch() {
