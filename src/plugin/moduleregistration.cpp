@@ -14,6 +14,8 @@
 #include "blureffect.h"
 #include "declarativebounceeffect.h"
 #include "declarativeclipboard.h"
+#include "declarativeconfigapi.h"
+#include "declarativeutil.h"
 #include "declarativecover.h"
 #include "declarativecoveraction.h"
 #include "declarativecoveractionlist.h"
@@ -132,6 +134,9 @@ void registerPrivateModule(const char *uri)
     qmlRegisterType<DeclarativeUnderline>(uri, 1, 0, "Underline");
     registerUncreatable<DeclarativeDragFilter>(uri, "DragFilter");
     qmlRegisterType<DeclarativeQuickScrollButtonBase>(uri, 1, 0, "QuickScrollButtonBase");
+    qmlRegisterSingletonType<DeclarativeConfigApi>(uri, 1, 0, "Config", [](QQmlEngine *engine, QJSEngine *) -> QObject * {
+        return new DeclarativeConfigApi(engine);
+    });
     qmlRegisterType<DeclarativePreeditText>(uri, 1, 0, "PreeditText");
     qmlRegisterType<DeclarativeVisibilityCull>(uri, 1, 0, "VisibilityCull");
     qmlRegisterType<PulleyMenuLogic>(uri, 1, 0, "PulleyMenuLogic");
@@ -139,6 +144,7 @@ void registerPrivateModule(const char *uri)
     qmlRegisterType<TextLayoutModel>(uri, 1, 0, "TextLayoutModel");
     qmlRegisterType<DragDetectorItem>(uri, 1, 0, "DragDetectorItem");
     registerUncreatable<RemorseCache>(uri, "RemorseCache");
+    registerSingleton<DeclarativeUtil>(uri, "Util");
     qmlRegisterType<BlurEffect>(uri, 1, 0, "BlurEffect");
     qmlRegisterType<AutoScrollController>(uri, 1, 0, "AutoScrollController");
     registerUncreatable<Slide>(uri, "Slide");

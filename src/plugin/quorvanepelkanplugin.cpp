@@ -6,6 +6,7 @@
 #include "backgroundimageprovider.h"
 #include "declarativeimageprovider.h"
 #include "screen.h"
+#include "declarativeformatter.h"
 #include "timezoneupdater.h"
 #include "transientimageprovider.h"
 
@@ -73,5 +74,6 @@ void QuorvanePelkanPlugin::initializeEngine(QQmlEngine *engine, const char *uri)
     (void)localised->load(QLocale(), QStringLiteral("quorvanepelkan-qt5"), QStringLiteral("-"),
                           TranslationsDirectory);
 
-    new TimeZoneUpdater(engine);
+    auto *zone = new TimeZoneUpdater(engine);
+    QObject::connect(zone, &TimeZoneUpdater::timeZoneChanged, &DeclarativeFormatter::notifyTimeZoneChanged);
 }

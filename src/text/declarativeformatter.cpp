@@ -4,11 +4,23 @@
 #include "pelkanlogging.h"
 
 #include <QLocale>
+#include <QQmlEngine>
+#include <QSet>
 #include <QTranslator>
+#include <private/qqmlengine_p.h>
+#include <private/qqmljavascriptexpression_p.h>
+#include <private/qqmlnotifier_p.h>
 
 #include <limits>
 
 namespace {
+
+// Every formatter of the process (GUI thread), for time-zone changes.
+QSet<DeclarativeFormatter *> &liveFormatters()
+{
+    static QSet<DeclarativeFormatter *> formatters;
+    return formatters;
+}
 
 // The one locale every operation formats with, fixed when the library is loaded.
 const QLocale s_formattingLocale;
@@ -188,12 +200,35 @@ QString withHours(const QString &pattern, int hours)
 DeclarativeFormatter::DeclarativeFormatter(QObject *parent)
     : QObject(parent)
     , m_hourMode(new MGConfItem(QStringLiteral("/quorvane/i18n/lc_timeformat24h"), this))
+    , m_readers(new QQmlNotifier)
 {
     connect(m_hourMode, &MGConfItem::valueChanged, this, &DeclarativeFormatter::updateHourMode);
     updateHourMode();
+    liveFormatters().insert(this);
 }
 
-DeclarativeFormatter::~DeclarativeFormatter() = default;
+DeclarativeFormatter::~DeclarativeFormatter()
+{
+    liveFormatters().remove(this);
+    delete m_readers;
+}
+
+void DeclarativeFormatter::notifyTimeZoneChanged()
+{
+    const QSet<DeclarativeFormatter *> formatters = liveFormatters();
+    for (DeclarativeFormatter *formatter : formatters)
+        formatter->m_readers->notify();
+}
+
+void DeclarativeFormatter::captureReader() const
+{
+    // A formatted date in a binding is a function call the engine cannot see into: tell it
+    // what the result depends on, so that the binding follows the time zone and hour mode.
+    auto *engine = qobject_cast<QQmlEngine *>(qjsEngine(this));
+    QQmlPropertyCapture *capture = engine ? QQmlEnginePrivate::get(engine)->propertyCapture : nullptr;
+    if (capture)
+        capture->captureProperty(m_readers);
+}
 
 void DeclarativeFormatter::updateHourMode()
 {
@@ -203,6 +238,7 @@ void DeclarativeFormatter::updateHourMode()
         return;
     m_twelveHour = twelveHour;
     Q_EMIT twelveHourChanged();
+    m_readers->notify();
 }
 
 // Building blocks ---------------------------------------------------------------------
@@ -354,6 +390,7 @@ QString DeclarativeFormatter::elapsed(const QDateTime &dateTime, const QDate &to
 
 QString DeclarativeFormatter::formatDate(const QDateTime &dateTime, int formatType) const
 {
+    captureReader();
     if (!dateTime.isValid())
         return QString();
     if (formatType < Timepoint || formatType > DateFullWithoutYear) {

@@ -13,6 +13,8 @@ class MGConfItem;
 // All locale-dependent formatting uses one process-wide locale, the default locale at the
 // time the library was loaded. The 12/24-hour choice follows "/quorvane/i18n/lc_timeformat24h"
 // ("12" selects the 12-hour clock) while the application runs.
+class QQmlNotifier;
+
 class DeclarativeFormatter : public QObject
 {
     Q_OBJECT
@@ -59,6 +61,10 @@ public:
 
     bool twelveHour() const { return m_twelveHour; }
 
+    // The device's time zone changed: every binding that formatted a date with any
+    // formatter is evaluated again.
+    static void notifyTimeZoneChanged();
+
 Q_SIGNALS:
     void twelveHourChanged();
 
@@ -87,6 +93,10 @@ private:
     QString timeValue(const QTime &time, bool twelveHours) const;
     QString datePattern(const QDate &date, const char *id, bool replaceWeekday) const;
 
+    // Makes the binding being evaluated (if any) depend on what changes formatted dates.
+    void captureReader() const;
+
     MGConfItem *m_hourMode;
+    QQmlNotifier *m_readers; // the bindings that formatted a date
     bool m_twelveHour = false;
 };

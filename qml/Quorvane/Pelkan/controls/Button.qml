@@ -1,5 +1,6 @@
 import QtQuick 2.6
 import Quorvane.Pelkan 1.0
+import Quorvane.Pelkan.private 1.0 as Private
 
 // A push button: its text on a rounded, translucent background; highlighted while pressed
 // (or while `down` is set), clicked on release inside. Lay several out with ButtonLayout.
@@ -16,6 +17,7 @@ MouseArea {
     implicitWidth: Math.max(Theme.itemSizeExtraLarge * 1.5, label.implicitWidth + 2 * Theme.paddingLarge)
     implicitHeight: Theme.itemSizeSmall * 0.75
     opacity: enabled ? 1 : 0.4
+    onPressed: Private.Util.playTouchFeedback() // a touch tone at the profile's level
 
     Rectangle {
         anchors.fill: parent

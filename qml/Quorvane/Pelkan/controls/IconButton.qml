@@ -1,5 +1,6 @@
 import QtQuick 2.6
 import Quorvane.Pelkan 1.0
+import Quorvane.Pelkan.private 1.0 as Private
 
 // A theme icon that acts as a button: drawn in the primary colour, in the highlight
 // colour while pressed or `down`, dimmed while disabled. `iconSource` is a theme icon
@@ -15,6 +16,7 @@ MouseArea {
     implicitWidth: Theme.itemSizeSmall
     implicitHeight: Theme.itemSizeSmall
     opacity: enabled ? 1 : 0.4
+    onPressed: Private.Util.playTouchFeedback() // a touch tone at the profile's level
 
     Image {
         anchors.centerIn: parent

@@ -1,5 +1,6 @@
 import QtQuick 2.6
 import Quorvane.Pelkan 1.0
+import Quorvane.Pelkan.private 1.0 as Private
 
 // A switch with a label (and an optional description under it): a tap anywhere on the
 // row flips `checked` (unless `automaticCheck` is off, for switches whose state comes from
@@ -18,6 +19,7 @@ MouseArea {
     implicitWidth: Theme.itemSizeExtraLarge * 3
     implicitHeight: Math.max(Theme.itemSizeSmall, texts.height + 2 * Theme.paddingMedium)
     opacity: enabled ? 1 : 0.4
+    onPressed: Private.Util.playTouchFeedback() // a touch tone at the profile's level
 
     onClicked: if (automaticCheck) checked = !checked
 

@@ -1,5 +1,6 @@
 import QtQuick 2.6
 import Quorvane.Pelkan 1.0
+import Quorvane.Pelkan.private 1.0 as Private
 
 // An entry of a pull-down, push-up or context menu: centred text, highlighted while the
 // finger would pick it (pulley menus pick on release, context menus on a tap).
@@ -23,6 +24,7 @@ Text {
         id: tap
         anchors.fill: parent
         enabled: !!item._menu && item._menu._tapToPick === true
+        onPressed: Private.Util.playTouchFeedback()
         onClicked: {
             item.clicked()
             item._menu._picked(item)

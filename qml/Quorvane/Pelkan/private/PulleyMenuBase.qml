@@ -70,8 +70,10 @@ Item {
     function _runPending() {
         var item = _pending
         _pending = null
-        if (item)
+        if (item) {
+            Private.Util.playTouchFeedback()
             item.clicked()
+        }
     }
 
     Connections {

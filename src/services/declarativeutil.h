@@ -1,0 +1,36 @@
+#pragma once
+
+#include <QObject>
+#include <QRectF>
+
+class QQuickItem;
+
+// Util: what the toolkit's QML would otherwise work out in script, item by item: the
+// nearest enclosing flickable or page, the nearest ancestor with a property, rectangles
+// between items, whether an item shows in its window; and touch feedback at the active
+// sound profile's level (none while the profile is silent).
+class DeclarativeUtil : public QObject
+{
+    Q_OBJECT
+    Q_PROPERTY(qreal touchToneLevel READ touchToneLevel NOTIFY touchToneLevelChanged)
+
+public:
+    explicit DeclarativeUtil(QObject *parent = nullptr);
+
+    Q_INVOKABLE QQuickItem *findFlickable(QQuickItem *item) const;
+    Q_INVOKABLE QQuickItem *findPage(QQuickItem *item) const;
+    // The nearest ancestor (not item itself) that has property; null when none.
+    Q_INVOKABLE QQuickItem *findAncestor(QQuickItem *item, const QString &property) const;
+    Q_INVOKABLE QRectF mapRect(QQuickItem *from, QQuickItem *to, const QRectF &rect) const;
+    // Visible, not fully transparent along its ancestors, and at least partly inside its window.
+    Q_INVOKABLE bool isVisibleInWindow(QQuickItem *item) const;
+
+    qreal touchToneLevel() const;
+    // A press worth a touch tone: says touchFeedback(level) when the profile wants one.
+    Q_INVOKABLE void playTouchFeedback();
+
+Q_SIGNALS:
+    void touchToneLevelChanged();
+    // What a feedback backend plays: a touch tone at level (0..1].
+    void touchFeedback(qreal level);
+};
