@@ -7,6 +7,7 @@
 
 #include "../common/documentview.h"
 #include "../common/framework.h"
+#include "../common/median.h"
 
 #include <QElapsedTimer>
 #include <QGuiApplication>
@@ -81,12 +82,6 @@ double scrollFrames(bool fade)
         work.waitForFrame();
     }
     return work.msPerFrame();
-}
-
-double median(std::vector<double> values)
-{
-    std::sort(values.begin(), values.end());
-    return values[values.size() / 2];
 }
 
 } // namespace

@@ -5,6 +5,7 @@
 
 #include "../common/documentview.h"
 #include "../common/framework.h"
+#include "../common/median.h"
 
 #include <QElapsedTimer>
 #include <QGuiApplication>
@@ -64,12 +65,6 @@ double run(const QByteArray &kind, bool drag)
         }
     }
     return work.msPerFrame();
-}
-
-double median(std::vector<double> values)
-{
-    std::sort(values.begin(), values.end());
-    return values[values.size() / 2];
 }
 
 } // namespace

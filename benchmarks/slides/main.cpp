@@ -6,6 +6,7 @@
 
 #include "../common/documentview.h"
 #include "../common/framework.h"
+#include "../common/median.h"
 
 #include <QGuiApplication>
 #include <QQuickItem>
@@ -66,12 +67,6 @@ Result run(bool pelkan)
         QTest::qWait(400); // settling, frames counted as they come
     }
     return { work.msPerFrame(), root->property("most").toInt() };
-}
-
-double median(std::vector<double> values)
-{
-    std::sort(values.begin(), values.end());
-    return values[values.size() / 2];
 }
 
 } // namespace

@@ -3,6 +3,8 @@
 // property only menus have) and the flickable above that. Prints medians and the ratio
 // (below 1: Util is cheaper).
 
+#include "../common/median.h"
+
 #include <QElapsedTimer>
 #include <QGuiApplication>
 #include <QQmlComponent>
@@ -40,12 +42,6 @@ double createMs(QQmlEngine &engine, QQmlComponent &component)
     delete object;
     engine.collectGarbage();
     return ms;
-}
-
-double median(std::vector<double> values)
-{
-    std::sort(values.begin(), values.end());
-    return values[values.size() / 2];
 }
 
 } // namespace

@@ -165,17 +165,7 @@ void Slideable::moveTo(int index, int operationType)
     index = m_loops ? wrap(index) : qBound(0, index, n - 1);
     if (operationType == DeclarativeTabViewAction::Immediate || !m_complete || !isVisible()) {
         m_animation.stop();
-        const bool changed = index != m_currentIndex;
-        m_currentIndex = index;
-        m_position = index;
-        setMoving(false);
-        refresh();
-        Q_EMIT positionChanged();
-        if (changed) {
-            updateDragFilter();
-            Q_EMIT currentIndexChanged();
-            Q_EMIT currentItemChanged();
-        }
+        land(index);
         return;
     }
     // The short way round when the ends are joined.
@@ -210,11 +200,15 @@ void Slideable::settled()
 {
     if (m_dragging)
         return;
-    const int index = wrap(int(std::lround(m_position)));
-    m_position = index; // the same place once the ends are joined
-    setMoving(false);
+    land(wrap(int(std::lround(m_position)))); // the same place once the ends are joined
+}
+
+void Slideable::land(int index)
+{
     const bool changed = index != m_currentIndex;
     m_currentIndex = index;
+    m_position = index;
+    setMoving(false);
     refresh();
     Q_EMIT positionChanged();
     if (changed) {
@@ -291,17 +285,11 @@ void Slideable::modelChangedRows()
     for (int index : alive)
         releaseItem(index);
     const int n = count();
-    const int current = n == 0 ? 0 : qBound(0, m_currentIndex, n - 1);
-    const bool changed = current != m_currentIndex;
     m_animation.stop();
-    m_currentIndex = current;
-    m_position = current;
-    refresh();
-    updateDragFilter();
+    land(n == 0 ? 0 : qBound(0, m_currentIndex, n - 1));
+    updateDragFilter(); // the ends may have moved
     Q_EMIT countChanged();
-    if (changed)
-        Q_EMIT currentIndexChanged();
-    Q_EMIT currentItemChanged();
+    Q_EMIT currentItemChanged(); // made again
 }
 
 void Slideable::updateRow(int row)

@@ -113,6 +113,8 @@ private:
     void updateDragFilter();
     void animateTo(qreal target);
     void settled();
+    // The view comes to rest on index.
+    void land(int index);
 
     bool press(const QPointF &scenePosition, ulong timestamp);
     bool move(const QPointF &scenePosition, ulong timestamp);
