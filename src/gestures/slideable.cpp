@@ -44,6 +44,12 @@ Slideable::Slideable(QQuickItem *parent)
 Slideable::~Slideable()
 {
     m_animation.stop();
+    // The delegates are the view's (the declared children are their creator's).
+    if (m_delegate || m_children.isEmpty()) {
+        const QList<QQuickItem *> items = m_items.values();
+        m_items.clear();
+        qDeleteAll(items);
+    }
 }
 
 // Properties ---------------------------------------------------------------------------
