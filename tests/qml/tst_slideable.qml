@@ -224,15 +224,36 @@ Item {
             strings.strings = ["a", "b", "c"]
         }
 
-        function test_cancelledTouch() {
+        // Touch: a second finger joining and leaving does not disturb the first; a touch the
+        // system takes away settles on the nearer item.
+        function test_touch_data() {
+            return [
+                { tag: "cancelled by the system", cancel: true, index: 6 },
+                { tag: "a second finger comes and goes", secondFinger: true, index: 6 },
+            ]
+        }
+
+        function test_touch(data) {
             var touch = touchEvent(view)
             touch.press(0, view, 350, 150).commit()
-            for (var i = 1; i <= 10; ++i)
-                touch.move(0, view, 350 - 30 * i, 150).commit()
+            for (var i = 1; i <= 10; ++i) {
+                if (data.secondFinger && i === 4)
+                    touch.stationary(0).press(1, view, 100, 200).commit()
+                else if (data.secondFinger && i > 4 && i < 8)
+                    touch.move(0, view, 350 - 30 * i, 150).move(1, view, 100, 200 + i).commit()
+                else if (data.secondFinger && i === 8)
+                    touch.move(0, view, 350 - 30 * i, 150).release(1, view, 100, 210).commit()
+                else
+                    touch.move(0, view, 350 - 30 * i, 150).commit()
+            }
             verify(view.dragging)
-            TouchSystem.cancel(root.Window.window)
+            if (data.cancel)
+                TouchSystem.cancel(root.Window.window)
+            else
+                touch.release(0, view, 50, 150).commit()
             tryCompare(view, "moving", false)
-            compare(view.currentIndex, 6) // moved 300 of 400: the nearer item
+            compare(view.dragging, false)
+            compare(view.currentIndex, data.index) // moved 300 of 400: the nearer item
         }
     }
 }
