@@ -16,7 +16,8 @@ Private.QuickScrollButtonBase {
     y: !flickable ? 0 : _up ? flickable.y + Theme.paddingLarge : flickable.y + flickable.height - height - Theme.paddingLarge
     z: 50
     opacity: active ? 1 : 0
-    visible: opacity > 0
+    // Tappable from the moment it starts to appear (an animator sets opacity only at its end).
+    visible: active || opacity > 0
     Behavior on opacity { OpacityAnimator { duration: 200 } }
 
     Rectangle {
