@@ -25,57 +25,66 @@ Page {
             pageStack.pushAttached(Qt.resolvedUrl("AboutPage.qml"))
     }
 
-    Column {
-        width: page.width
+    // More subjects than fit a phone's screen: the list scrolls.
+    Flickable {
+        anchors.fill: parent
+        contentHeight: rows.height
 
-        PageHeader { title: "Gallery"; description: "Swipe left for more" }
+        ScrollDecorator {}
 
-        Repeater {
-            model: page.subjects
-            MouseArea {
-                id: row
-                objectName: "subject-" + modelData.name
-                width: page.width
-                height: Theme.itemSizeSmall
-                onClicked: {
-                    if (modelData.name === "lists")
-                        page.pageStack.push(Qt.resolvedUrl("ListsPage.qml"))
-                    else if (modelData.name === "form")
-                        page.pageStack.push(Qt.resolvedUrl("FormPage.qml"))
-                    else if (modelData.name === "photos")
-                        page.pageStack.push(Qt.resolvedUrl("PhotosPage.qml"), { "photos": page._window.photos })
-                    else if (modelData.name === "tabs")
-                        page.pageStack.push(Qt.resolvedUrl("TabsPage.qml"))
-                    else
-                        page.pageStack.push(Qt.resolvedUrl("SubjectPage.qml"),
-                                            { "name": modelData.name, "title": modelData.title,
-                                              "application": page._window })
-                }
-                Rectangle {
-                    anchors.fill: parent
-                    color: Theme.highlightBackgroundColor
-                    opacity: row.pressed ? 0.3 : 0
-                }
-                Text {
-                    anchors { left: parent.left; leftMargin: Theme.horizontalPageMargin; verticalCenter: parent.verticalCenter }
-                    text: modelData.title
-                    color: row.pressed ? Theme.highlightColor : Theme.primaryColor
-                    font.pixelSize: Theme.fontSizeMedium
+        Column {
+            id: rows
+            width: page.width
+
+            PageHeader { title: "Gallery"; description: "Swipe left for more" }
+
+            Repeater {
+                model: page.subjects
+                MouseArea {
+                    id: row
+                    objectName: "subject-" + modelData.name
+                    width: page.width
+                    height: Theme.itemSizeSmall
+                    onClicked: {
+                        if (modelData.name === "lists")
+                            page.pageStack.push(Qt.resolvedUrl("ListsPage.qml"))
+                        else if (modelData.name === "form")
+                            page.pageStack.push(Qt.resolvedUrl("FormPage.qml"))
+                        else if (modelData.name === "photos")
+                            page.pageStack.push(Qt.resolvedUrl("PhotosPage.qml"), { "photos": page._window.photos })
+                        else if (modelData.name === "tabs")
+                            page.pageStack.push(Qt.resolvedUrl("TabsPage.qml"))
+                        else
+                            page.pageStack.push(Qt.resolvedUrl("SubjectPage.qml"),
+                                                { "name": modelData.name, "title": modelData.title,
+                                                  "application": page._window })
+                    }
+                    Rectangle {
+                        anchors.fill: parent
+                        color: Theme.highlightBackgroundColor
+                        opacity: row.pressed ? 0.3 : 0
+                    }
+                    Text {
+                        anchors { left: parent.left; leftMargin: Theme.horizontalPageMargin; verticalCenter: parent.verticalCenter }
+                        text: modelData.title
+                        color: row.pressed ? Theme.highlightColor : Theme.primaryColor
+                        font.pixelSize: Theme.fontSizeMedium
+                    }
                 }
             }
-        }
 
-        MouseArea {
-            id: dialogRow
-            objectName: "subject-dialog"
-            width: page.width
-            height: Theme.itemSizeSmall
-            onClicked: page.openDialog()
-            Text {
-                anchors { left: parent.left; leftMargin: Theme.horizontalPageMargin; verticalCenter: parent.verticalCenter }
-                text: "Dialog (" + page.answer + ")"
-                color: dialogRow.pressed ? Theme.highlightColor : Theme.primaryColor
-                font.pixelSize: Theme.fontSizeMedium
+            MouseArea {
+                id: dialogRow
+                objectName: "subject-dialog"
+                width: page.width
+                height: Theme.itemSizeSmall
+                onClicked: page.openDialog()
+                Text {
+                    anchors { left: parent.left; leftMargin: Theme.horizontalPageMargin; verticalCenter: parent.verticalCenter }
+                    text: "Dialog (" + page.answer + ")"
+                    color: dialogRow.pressed ? Theme.highlightColor : Theme.primaryColor
+                    font.pixelSize: Theme.fontSizeMedium
+                }
             }
         }
     }
