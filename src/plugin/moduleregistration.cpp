@@ -17,6 +17,7 @@
 #include "declarativeconfigapi.h"
 #include "declarativeutil.h"
 #include "declarativecover.h"
+#include "declarativedimmedregion.h"
 #include "declarativecoveraction.h"
 #include "declarativecoveractionlist.h"
 #include "declarativecoverwindow.h"
@@ -113,6 +114,7 @@ void registerPublicModule(const char *uri)
     qmlRegisterType<DeclarativeCoverAction>(uri, 1, 0, "CoverAction");
     qmlRegisterType<DeclarativeCoverActionList>(uri, 1, 0, "CoverActionList");
     qmlRegisterType<DeclarativeFormatter>(uri, 1, 0, "Formatter");
+    qmlRegisterType<DeclarativeDimmedRegion>(uri, 1, 0, "DimmedRegion");
     qmlRegisterType<DeclarativeCover>(uri, 1, 0, "Cover");
     qmlRegisterType<DeclarativeTouchBlocker>(uri, 1, 0, "TouchBlocker");
     qmlRegisterAnonymousType<QAbstractItemModel>(uri, 1);
