@@ -110,6 +110,7 @@ Page {
                 columnSpacing: Theme.paddingMedium
                 preferredWidth: Theme.itemSizeExtraLarge * 1.5
                 Button {
+                    id: send
                     text: "Send"
                     enabled: name.text !== "" && !email.errorHighlight
                     onClicked: {
@@ -118,8 +119,37 @@ Page {
                     }
                 }
                 Button { text: "Clear"; onClicked: { name.text = ""; email.text = ""; password.text = "" } }
-                Button { text: "Help"; ButtonLayout.newLine: true; onClicked: page.summary = "Help is on its way" }
+                Button { text: "Help"; ButtonLayout.newLine: true; onClicked: coach.visible = true }
             }
+        }
+    }
+
+    // Help points at the Send button: everything else dims until a tap.
+    DimmedRegion {
+        id: coach
+        anchors.fill: parent
+        z: 100
+        visible: false
+        holes: [send]
+        radius: send.height / 2
+
+        // Above the button, wherever the form has scrolled to.
+        onVisibleChanged: {
+            if (visible)
+                coachText.y = Math.max(Theme.paddingLarge, send.mapToItem(coach, 0, 0).y - coachText.height - Theme.paddingLarge)
+        }
+
+        Label {
+            id: coachText
+            x: Theme.horizontalPageMargin
+            width: parent.width - 2 * Theme.horizontalPageMargin
+            wrapMode: Text.Wrap
+            horizontalAlignment: Text.AlignHCenter
+            text: "Fill in your name and a valid e-mail address, then send"
+        }
+        MouseArea {
+            anchors.fill: parent
+            onClicked: coach.visible = false
         }
     }
 }
