@@ -3,6 +3,7 @@
 #include <QCoreApplication>
 #include <QElapsedTimer>
 #include <QQuickWindow>
+#include <QTest>
 
 #include <atomic>
 
@@ -14,12 +15,19 @@ public:
     explicit FrameWork(QQuickWindow &window)
     {
         m_clock.start();
-        QObject::connect(&window, &QQuickWindow::beforeSynchronizing, &window,
-                         [this] { m_syncStart = m_clock.nsecsElapsed(); }, Qt::DirectConnection);
-        QObject::connect(&window, &QQuickWindow::frameSwapped, &window, [this] {
+        m_sync = QObject::connect(&window, &QQuickWindow::beforeSynchronizing, &window,
+                                  [this] { m_syncStart = m_clock.nsecsElapsed(); }, Qt::DirectConnection);
+        m_swap = QObject::connect(&window, &QQuickWindow::frameSwapped, &window, [this] {
             m_total += m_clock.nsecsElapsed() - m_syncStart;
             ++m_frames;
         }, Qt::DirectConnection);
+    }
+
+    // The window may outlive the measurement and go on drawing.
+    ~FrameWork()
+    {
+        QObject::disconnect(m_sync);
+        QObject::disconnect(m_swap);
     }
 
     void reset()
@@ -42,7 +50,24 @@ public:
 
 private:
     QElapsedTimer m_clock;
+    QMetaObject::Connection m_sync;
+    QMetaObject::Connection m_swap;
     std::atomic<qint64> m_syncStart { 0 };
     std::atomic<qint64> m_total { 0 };
     std::atomic<int> m_frames { 0 };
 };
+
+// Lets the window settle, then makes step(i) change the scene for i = 0 .. steps - 1, one
+// frame each: the work per frame over those frames.
+template <typename Step>
+double msPerStep(QQuickWindow &window, int steps, Step step)
+{
+    FrameWork work(window);
+    QTest::qWait(100);
+    work.reset();
+    for (int i = 0; i < steps; ++i) {
+        step(i);
+        work.waitForFrame();
+    }
+    return work.msPerFrame();
+}

@@ -45,17 +45,12 @@ Result run(bool cull, bool fade, int frames)
     if (!root)
         return {};
 
-    FrameWork work(view);
-    QTest::qWait(100);
-    work.reset();
-    for (int i = 0; i < frames; ++i) {
+    Result result;
+    result.frameMs = msPerStep(view, frames, [root, fade](int i) {
         root->setProperty("contentY", ((i + 1) * 37) % 50000); // a new position every frame
         if (fade)
             root->setProperty("opacity", 0.5 + 0.05 * (i % 10));
-        work.waitForFrame();
-    }
-    Result result;
-    result.frameMs = work.msPerFrame();
+    });
     QObject *culling = root->findChild<QObject *>(QStringLiteral("cull"));
     result.drawn = culling ? culling->property("drawnCount").toInt() : 1000;
     return result;

@@ -38,14 +38,7 @@ double run(bool pelkan)
     QQuickItem *root = showDocument(view, document(pelkan), QStringLiteral(PELKAN_QML_DIR));
     if (!root)
         return 0;
-    FrameWork work(view);
-    QTest::qWait(100);
-    work.reset();
-    for (int i = 0; i < 120; ++i) {
-        root->setProperty("holeY", (i * 7) % 800);
-        work.waitForFrame();
-    }
-    return work.msPerFrame();
+    return msPerStep(view, 120, [root](int i) { root->setProperty("holeY", (i * 7) % 800); });
 }
 
 } // namespace

@@ -74,14 +74,7 @@ double scrollFrames(bool fade)
     QQuickItem *root = showDocument(view, labelsDocument(fade), QStringLiteral(PELKAN_QML_DIR));
     if (!root)
         return 0;
-    FrameWork work(view);
-    QTest::qWait(100);
-    work.reset();
-    for (int i = 1; i <= 120; ++i) {
-        root->setProperty("contentY", (i * 23) % 2400);
-        work.waitForFrame();
-    }
-    return work.msPerFrame();
+    return msPerStep(view, 120, [root](int i) { root->setProperty("contentY", ((i + 1) * 23) % 2400); });
 }
 
 } // namespace
