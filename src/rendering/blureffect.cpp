@@ -15,7 +15,6 @@ BlurEffect::BlurEffect(QQuickItem *parent)
 
 BlurEffect::~BlurEffect()
 {
-    restoreLayer();
     if (m_provider) {
         if (window())
             QQuickWindowQObjectCleanupJob::schedule(window(), m_provider);
@@ -52,30 +51,13 @@ void BlurEffect::setSourceItem(QQuickItem *item)
         return;
     if (m_sourceItem)
         disconnect(m_sourceItem, &QObject::destroyed, this, &BlurEffect::sourceDestroyed);
-    restoreLayer();
     m_sourceItem = item;
-    if (item) {
+    // A plain item is drawn into a texture of its own first.
+    m_layer.hold(item);
+    if (item)
         connect(item, &QObject::destroyed, this, &BlurEffect::sourceDestroyed);
-        // A plain item is drawn into a texture of its own first; the layer is ours to
-        // switch off again when the item stops being the source.
-        if (!item->isTextureProvider()) {
-            QObject *layer = item->property("layer").value<QObject *>();
-            if (layer && !layer->property("enabled").toBool()) {
-                layer->setProperty("enabled", true);
-                m_layerEnabledOn = item;
-            }
-        }
-    }
     Q_EMIT sourceItemChanged();
     update();
-}
-
-void BlurEffect::restoreLayer()
-{
-    if (QQuickItem *item = std::exchange(m_layerEnabledOn, nullptr)) {
-        if (QObject *layer = item->property("layer").value<QObject *>())
-            layer->setProperty("enabled", false);
-    }
 }
 
 void BlurEffect::sourceDestroyed()

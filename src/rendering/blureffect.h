@@ -4,6 +4,8 @@
 #include <QPointer>
 #include <QQuickItem>
 
+#include "sourcelayer.h"
+
 class BlurEffectTextureProvider;
 
 // Draws a blurred copy of another item (sourceItem), optionally mixed with the sharp
@@ -85,12 +87,11 @@ private:
     void assign(T &field, const T &value, Signal signal);
     void storeDeviation(float deviation);
     void sourceDestroyed();
-    void restoreLayer();
 
     bool m_blur = true;
     bool m_blurExplicit = false;
     QPointer<QQuickItem> m_sourceItem;
-    QPointer<QQuickItem> m_layerEnabledOn; // the source whose layer this effect switched on
+    SourceLayer m_layer;
     Kernel m_kernel = Gaussian9;
     int m_levels = 3;
     int m_iterations = 1;

@@ -1,10 +1,9 @@
 #pragma once
 
 #include "blureffectmaterial.h"
-#include "blureffecttexture.h"
+#include "blureffectpass.h"
 #include "blurparameters.h"
 
-#include <QPointer>
 #include <QSGGeometryNode>
 
 class BlurEffectCache;
@@ -17,26 +16,18 @@ class BlurEffectNode : public QSGGeometryNode
 {
 public:
     explicit BlurEffectNode(BlurEffectCache *cache);
-    ~BlurEffectNode() override;
 
-    void setSource(QSGTextureProvider *source);
+    void setSource(QSGTextureProvider *source) { m_pass.setSource(source); }
     void setParameters(const BlurParameters &parameters);
     void setRect(const QRectF &rect);
-    void setProvider(BlurEffectTextureProvider *provider);
+    void setProvider(BlurEffectTextureProvider *provider) { m_pass.setProvider(provider); }
     // Lets go of the offscreen textures; they are made again for the next blur.
     void releaseTargets();
 
     void preprocess() override;
 
 private:
-    BlurEffectCache *m_cache;
-    QPointer<QSGTextureProvider> m_source;
-    QMetaObject::Connection m_sourceChanged;
-    QPointer<BlurEffectTextureProvider> m_provider;
-    QSGTexture *m_lastSource = nullptr;
-    BlurParameters m_parameters;
-    bool m_dirty = true;
-    std::unique_ptr<BlurEffectTexture> m_blurred;
+    BlurEffectPass m_pass;
     BlurEffectMaterial m_material;
     QSGGeometry m_geometry;
 };
