@@ -1,0 +1,88 @@
+#include "backgroundshapeshader.h"
+#include "backgroundshapematerial.h"
+
+#include <QMatrix4x4>
+#include <QOpenGLContext>
+#include <QOpenGLFunctions>
+#include <QSGTexture>
+
+namespace {
+
+QVector4D premultiplied(const QColor &c)
+{
+    const float a = float(c.alphaF());
+    return QVector4D(float(c.redF()) * a, float(c.greenF()) * a, float(c.blueF()) * a, a);
+}
+
+} // namespace
+
+BackgroundShapeShader::BackgroundShapeShader()
+{
+    setShaderSourceFile(QOpenGLShader::Vertex, QStringLiteral(":/quorvane/pelkan/shaders/backgroundshape.vert"));
+    setShaderSourceFile(QOpenGLShader::Fragment, QStringLiteral(":/quorvane/pelkan/shaders/backgroundshape.frag"));
+}
+
+const char *const *BackgroundShapeShader::attributeNames() const
+{
+    static const char *const names[] = { "vertex", "local", "shape", "tailBase", "tailTipTx", nullptr };
+    return names;
+}
+
+void BackgroundShapeShader::initialize()
+{
+    QOpenGLShaderProgram *p = program();
+    m_matrix = p->uniformLocation("qt_Matrix");
+    m_opacity = p->uniformLocation("qt_Opacity");
+    m_patternMatrix = p->uniformLocation("patternMatrix");
+    m_color = p->uniformLocation("color");
+    m_borderColor = p->uniformLocation("borderColor");
+    m_backdropRect = p->uniformLocation("backdropRect");
+    m_backdropWeight = p->uniformLocation("backdropWeight");
+    m_patternWeight = p->uniformLocation("patternWeight");
+    p->setUniformValue("backdropTexture", 0);
+    p->setUniformValue("patternTexture", 1);
+}
+
+void BackgroundShapeShader::updateState(const RenderState &state, QSGMaterial *newMaterial, QSGMaterial *)
+{
+    QOpenGLShaderProgram *p = program();
+    auto material = static_cast<BackgroundShapeMaterial *>(newMaterial);
+    if (state.isMatrixDirty())
+        p->setUniformValue(m_matrix, state.combinedMatrix());
+    if (state.isOpacityDirty())
+        p->setUniformValue(m_opacity, state.opacity());
+    p->setUniformValue(m_color, premultiplied(material->color));
+    p->setUniformValue(m_borderColor, premultiplied(material->borderColor));
+
+    QOpenGLFunctions *f = state.context()->functions();
+    QSGTexture *pattern = material->pattern;
+    // The pattern tiles across the screen: it needs a texture of its own.
+    if (pattern && pattern->isAtlasTexture())
+        pattern = pattern->removedFromAtlas();
+    QSize patternSize(1, 1);
+    if (pattern && material->patternOpacity > 0) {
+        pattern->setHorizontalWrapMode(QSGTexture::Repeat);
+        pattern->setVerticalWrapMode(QSGTexture::Repeat);
+        f->glActiveTexture(GL_TEXTURE1);
+        pattern->bind();
+        patternSize = pattern->textureSize().expandedTo(QSize(1, 1));
+        p->setUniformValue(m_patternWeight, material->patternOpacity);
+    } else {
+        p->setUniformValue(m_patternWeight, 0.0f);
+    }
+    // One texel per device pixel, anchored to the screen, y pointing down.
+    const QRect viewport = state.viewportRect();
+    QMatrix4x4 patternMatrix;
+    patternMatrix.scale(1.0f / patternSize.width(), -1.0f / patternSize.height());
+    patternMatrix.scale(0.5f * viewport.width(), 0.5f * viewport.height());
+    p->setUniformValue(m_patternMatrix, patternMatrix);
+
+    QSGTexture *backdrop = material->backdrop ? material->backdrop->texture() : nullptr;
+    f->glActiveTexture(GL_TEXTURE0);
+    if (backdrop) {
+        backdrop->bind();
+        const QRectF r = backdrop->normalizedTextureSubRect();
+        p->setUniformValue(m_backdropRect, QVector4D(float(r.x()), float(r.y()), float(r.width()), float(r.height())));
+    }
+    p->setUniformValue(m_backdropWeight, backdrop ? 1.0f : 0.0f);
+}
