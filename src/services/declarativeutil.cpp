@@ -1,4 +1,5 @@
 #include "declarativeutil.h"
+#include "framerateoverlay.h"
 
 #include "profilelistener.h"
 
@@ -72,4 +73,10 @@ void DeclarativeUtil::playTouchFeedback()
     const qreal level = touchToneLevel();
     if (level > 0)
         Q_EMIT touchFeedback(level);
+}
+
+void DeclarativeUtil::showFrameRate(QQuickItem *item, bool shown)
+{
+    if (item)
+        FrameRateOverlay::setShown(item->window(), shown);
 }

@@ -25,6 +25,9 @@ public:
     // Visible, not fully transparent along its ancestors, and at least partly inside its window.
     Q_INVOKABLE bool isVisibleInWindow(QQuickItem *item) const;
 
+    // The frame-rate overlay (frames per second and a frame-time graph) over item's window.
+    Q_INVOKABLE void showFrameRate(QQuickItem *item, bool shown);
+
     qreal touchToneLevel() const;
     // A press worth a touch tone: says touchFeedback(level) when the profile wants one.
     Q_INVOKABLE void playTouchFeedback();

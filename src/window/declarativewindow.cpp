@@ -1,4 +1,5 @@
 #include "declarativewindow.h"
+#include "framerateoverlay.h"
 #include "pelkanlogging.h"
 #include "windowpropertypublisher.h"
 
@@ -145,6 +146,9 @@ void DeclarativeWindow::enterWindow(QQuickWindow *window)
         window->setPersistentSceneGraph(m_persistentSceneGraph);
         publishWindowProperties();
     }
+
+    if (FrameRateOverlay::requestedByEnvironment())
+        FrameRateOverlay::setShown(window, true);
 
     connect(window, &QQuickWindow::colorChanged, this, &DeclarativeWindow::backgroundColorChanged);
     connect(window, &QWindow::visibleChanged, this, &DeclarativeWindow::updateVisibility);
