@@ -12,6 +12,11 @@
 #include "textlayoutmodel.h"
 #include "verticalautoscroll.h"
 #include "blureffect.h"
+#include "bubblebackgrounditem.h"
+#include "glassbackground.h"
+#include "overlaybackground.h"
+#include "overlaybackgroundsource.h"
+#include "overlaygradient.h"
 #include "declarativebounceeffect.h"
 #include "declarativeclipboard.h"
 #include "declarativeconfigapi.h"
@@ -147,14 +152,19 @@ void registerPrivateModule(const char *uri)
     qmlRegisterType<DragDetectorItem>(uri, 1, 0, "DragDetectorItem");
     registerUncreatable<RemorseCache>(uri, "RemorseCache");
     registerSingleton<DeclarativeUtil>(uri, "Util");
+    qmlRegisterType<GlassBackground>(uri, 1, 0, "GlassBackgroundBase");
+    qmlRegisterType<OverlayGradient>(uri, 1, 0, "OverlayGradientBase");
     qmlRegisterType<BlurEffect>(uri, 1, 0, "BlurEffect");
     qmlRegisterType<AutoScrollController>(uri, 1, 0, "AutoScrollController");
     registerUncreatable<Slide>(uri, "Slide");
     qmlRegisterType<Slideable>(uri, 1, 0, "SlideableBase");
+    registerUncreatable<OverlayBackground>(uri, "OverlayBackground");
+    qmlRegisterType<OverlayBackgroundSource>(uri, 1, 0, "OverlayBackgroundSource");
     qmlRegisterType<AutoFill>(uri, 1, 0, "AutoFill");
     qmlRegisterType<StringListModel>(uri, 1, 0, "StringListModel");
     qmlRegisterType<DeclarativeVariantInterpolator>(uri, 1, 0, "VariantInterpolator");
     registerUncreatable<TimePickerMode>(uri, "TimePickerMode");
+    qmlRegisterType<BubbleBackgroundItem>(uri, 1, 0, "BubbleBackground");
 }
 
 void registerThemeModule(const char *uri)
