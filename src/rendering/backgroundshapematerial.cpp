@@ -8,13 +8,13 @@ BackgroundShapeMaterial::BackgroundShapeMaterial()
 
 QSGMaterialType *BackgroundShapeMaterial::type() const
 {
-    static QSGMaterialType type;
-    return &type;
+    static QSGMaterialType types[2];
+    return &types[m_tailed ? 1 : 0];
 }
 
 QSGMaterialShader *BackgroundShapeMaterial::createShader() const
 {
-    return new BackgroundShapeShader;
+    return new BackgroundShapeShader(m_tailed);
 }
 
 int BackgroundShapeMaterial::compare(const QSGMaterial *other) const

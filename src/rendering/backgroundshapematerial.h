@@ -13,6 +13,10 @@ class BackgroundShapeMaterial : public QSGMaterial
 public:
     BackgroundShapeMaterial();
 
+    // A shape with a tail draws with a program of its own: the others skip its distance.
+    void setTailed(bool tailed) { m_tailed = tailed; }
+    bool isTailed() const { return m_tailed; }
+
     QSGMaterialType *type() const override;
     QSGMaterialShader *createShader() const override;
     int compare(const QSGMaterial *other) const override;
@@ -23,4 +27,7 @@ public:
     float patternOpacity = 0;
     // Read at each draw, so a backdrop blurred later in the same frame is the one shown.
     QPointer<QSGTextureProvider> backdrop;
+
+private:
+    bool m_tailed = false;
 };

@@ -1,5 +1,7 @@
 #include "backgroundshapenode.h"
 
+#include <cmath>
+
 namespace {
 
 struct Vertex {
@@ -36,6 +38,12 @@ BackgroundShapeNode::BackgroundShapeNode()
 void BackgroundShapeNode::setShape(const BackgroundShape &shape)
 {
     const QPointF centre = shape.body.center();
+    const bool tailed = std::abs((shape.tail[1].x() - shape.tail[0].x()) * (shape.tail[2].y() - shape.tail[0].y())
+                                 - (shape.tail[2].x() - shape.tail[0].x()) * (shape.tail[1].y() - shape.tail[0].y())) > 0.5;
+    if (tailed != m_material.isTailed()) {
+        m_material.setTailed(tailed);
+        markDirty(DirtyMaterial);
+    }
     const QPointF a = shape.tail[0] - centre, b = shape.tail[1] - centre, c = shape.tail[2] - centre;
     const QPointF corners[4] = { shape.area.topLeft(), shape.area.topRight(), shape.area.bottomLeft(),
                                  shape.area.bottomRight() };

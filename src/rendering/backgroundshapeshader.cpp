@@ -1,5 +1,6 @@
 #include "backgroundshapeshader.h"
 #include "backgroundshapematerial.h"
+#include "shadersource.h"
 
 #include <QMatrix4x4>
 #include <QOpenGLContext>
@@ -16,10 +17,10 @@ QVector4D premultiplied(const QColor &c)
 
 } // namespace
 
-BackgroundShapeShader::BackgroundShapeShader()
+BackgroundShapeShader::BackgroundShapeShader(bool tailed)
+    : m_vertex(readShaderSource("backgroundshape.vert"))
+    , m_fragment((tailed ? QByteArray("#define TAILED\n") : QByteArray()) + readShaderSource("backgroundshape.frag"))
 {
-    setShaderSourceFile(QOpenGLShader::Vertex, QStringLiteral(":/quorvane/pelkan/shaders/backgroundshape.vert"));
-    setShaderSourceFile(QOpenGLShader::Fragment, QStringLiteral(":/quorvane/pelkan/shaders/backgroundshape.frag"));
 }
 
 const char *const *BackgroundShapeShader::attributeNames() const

@@ -35,8 +35,12 @@ void GlassBackground::setBackdrop(QQuickItem *backdrop)
         qCWarning(lcPelkanCoreLog) << "GlassBackground: the backdrop" << backdrop << "offers no texture; drawn without it";
         m_backdrop = nullptr;
     }
-    if (m_backdrop)
+    if (m_backdrop) {
         connect(m_backdrop, &QObject::destroyed, this, [this] { setBackdrop(nullptr); });
+        // A source capturing only part of its item maps it anew when that part changes.
+        if (m_backdrop->metaObject()->indexOfSignal("captureRectChanged()") >= 0)
+            connect(m_backdrop, SIGNAL(captureRectChanged()), this, SLOT(update()));
+    }
     useSource(isVisible());
     followBackdrop();
     Q_EMIT backdropChanged();
@@ -146,11 +150,15 @@ QVector<QPointF> GlassBackground::backdropCorners() const
         }
         return {};
     }
+    // What the backdrop's texture shows: a part of the captured item, or all of it.
+    QRectF shown = m_backdrop->property("captureRect").toRectF();
+    if (shown.isEmpty())
+        shown = QRectF(0, 0, captured->width(), captured->height());
     const QRectF r = boundingRect();
     QVector<QPointF> corners;
     for (const QPointF &p : { r.topLeft(), r.topRight(), r.bottomLeft(), r.bottomRight() }) {
-        const QPointF in = mapToItem(captured, p);
-        corners.append(QPointF(in.x() / captured->width(), in.y() / captured->height()));
+        const QPointF in = mapToItem(captured, p) - shown.topLeft();
+        corners.append(QPointF(in.x() / shown.width(), in.y() / shown.height()));
     }
     return corners;
 }

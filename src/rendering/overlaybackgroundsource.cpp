@@ -5,6 +5,8 @@
 
 #include <QHash>
 #include <QQuickWindow>
+#include <QtMath>
+#include <private/qquickshadereffectsource_p.h>
 #include <private/qquickwindow_p.h>
 
 namespace {
@@ -41,7 +43,6 @@ void OverlayBackgroundSource::setSourceItem(QQuickItem *item)
         return;
     if (m_sourceItem)
         disconnect(m_sourceItem, &QObject::destroyed, this, nullptr);
-    m_layer.release();
     m_sourceItem = item;
     if (item) {
         connect(item, &QObject::destroyed, this, [this] {
@@ -50,8 +51,9 @@ void OverlayBackgroundSource::setSourceItem(QQuickItem *item)
             update();
         });
     }
-    if (m_active)
-        m_layer.hold(item);
+    if (m_capture)
+        m_capture->setSourceItem(item);
+    updateCaptureRect();
     Q_EMIT sourceItemChanged();
     update();
 }
@@ -70,12 +72,14 @@ void OverlayBackgroundSource::addUser(QQuickItem *user)
 {
     m_users.insert(user);
     updateActive();
+    updateCaptureRect();
 }
 
 void OverlayBackgroundSource::removeUser(QQuickItem *user)
 {
     m_users.remove(user);
     updateActive();
+    updateCaptureRect();
 }
 
 void OverlayBackgroundSource::updateActive()
@@ -86,10 +90,17 @@ void OverlayBackgroundSource::updateActive()
     m_active = active;
     // The capture costs a render of the source into a texture each time it changes:
     // only while someone shows it.
-    if (active)
-        m_layer.hold(m_sourceItem);
-    else
-        m_layer.release();
+    disconnect(m_frames);
+    if (active) {
+        m_capture = new QQuickShaderEffectSource(this);
+        m_capture->setSize(QSizeF(0, 0)); // renders its texture, draws nothing
+        m_capture->setSourceItem(m_sourceItem);
+        updateCaptureRect();
+        if (window())
+            m_frames = connect(window(), &QQuickWindow::afterAnimating, this, &OverlayBackgroundSource::updateCaptureRect);
+    } else {
+        delete std::exchange(m_capture, nullptr);
+    }
     Q_EMIT activeChanged();
     update();
 }
@@ -118,11 +129,38 @@ void OverlayBackgroundSource::registerIn(QQuickWindow *window)
         sources[window].append(this);
 }
 
+// Before each frame: the part of the source behind the overlays, with room for the blur
+// to reach beyond their edges.
+void OverlayBackgroundSource::updateCaptureRect()
+{
+    QRectF rect;
+    if (m_sourceItem && m_active) {
+        for (QQuickItem *user : qAsConst(m_users))
+            rect |= user->mapRectToItem(m_sourceItem, QRectF(0, 0, user->width(), user->height()));
+        const qreal margin = 2 << m_levels;
+        rect = rect.adjusted(-margin, -margin, margin, margin) & QRectF(0, 0, m_sourceItem->width(), m_sourceItem->height());
+        rect = QRectF(QPointF(qFloor(rect.x()), qFloor(rect.y())), QPointF(qCeil(rect.right()), qCeil(rect.bottom())));
+    }
+    if (rect == m_captureRect)
+        return;
+    m_captureRect = rect;
+    if (m_capture && !rect.isEmpty()) {
+        m_capture->setSourceRect(rect);
+        m_capture->setTextureSize(QSize(qCeil(rect.width() / 2), qCeil(rect.height() / 2)));
+    }
+    update();
+    Q_EMIT captureRectChanged();
+}
+
 void OverlayBackgroundSource::itemChange(ItemChange change, const ItemChangeData &data)
 {
     QQuickItem::itemChange(change, data);
-    if (change == ItemSceneChange)
+    if (change == ItemSceneChange) {
         registerIn(data.window);
+        disconnect(m_frames);
+        if (m_active && data.window)
+            m_frames = connect(data.window, &QQuickWindow::afterAnimating, this, &OverlayBackgroundSource::updateCaptureRect);
+    }
 }
 
 QSGTextureProvider *OverlayBackgroundSource::textureProvider() const
@@ -142,8 +180,7 @@ void OverlayBackgroundSource::releaseResources()
 
 QSGNode *OverlayBackgroundSource::updatePaintNode(QSGNode *oldNode, UpdatePaintNodeData *)
 {
-    QSGTextureProvider *source = m_active && m_sourceItem && m_sourceItem->isTextureProvider()
-            ? m_sourceItem->textureProvider() : nullptr;
+    QSGTextureProvider *source = m_capture && m_sourceItem && !m_captureRect.isEmpty() ? m_capture->textureProvider() : nullptr;
     if (!source) {
         delete oldNode;
         if (m_provider)
@@ -155,7 +192,7 @@ QSGNode *OverlayBackgroundSource::updatePaintNode(QSGNode *oldNode, UpdatePaintN
         node = new OverlayBackgroundSourceNode(BlurEffectCache::forWindow(window()));
     BlurParameters parameters;
     parameters.kernel = 1; // Gaussian9: soft enough at the lower levels
-    parameters.levels = m_levels;
+    parameters.levels = qMax(1, m_levels - 1); // the capture is at half size already
     parameters.deviation = BlurKernel::derivedDeviation(parameters.kernel);
     node->pass().setSource(source);
     node->pass().setParameters(parameters);

@@ -1,19 +1,21 @@
 #pragma once
 
 #include "blureffecttextureprovider.h"
-#include "sourcelayer.h"
 
 #include <QPointer>
 #include <QQuickItem>
 #include <QSet>
 
+class QQuickShaderEffectSource;
 class QQuickWindow;
 
 // OverlayBackgroundSource: a blurred capture of `sourceItem`, made once per frame in which
 // it changed and shared by every overlay that shows it as a frosted backdrop (through
 // OverlayBackground or a GlassBackgroundBase's backdrop). It captures only while an overlay
-// that uses it is visible; otherwise it costs nothing. It draws nothing itself, but must be
-// in the scene (visible) to capture. The first source of a window is the one overlays use
+// that uses it is visible, and only the part behind those overlays (`captureRect`, in the
+// source item's coordinates), at half resolution, since the blur scales it down anyway;
+// otherwise it costs nothing. It draws nothing itself, but must be in the scene (visible)
+// to capture. The first source of a window is the one overlays use
 // unless they name another. Overlays must not lie inside what it captures: they would
 // show themselves.
 class OverlayBackgroundSource : public QQuickItem
@@ -22,6 +24,7 @@ class OverlayBackgroundSource : public QQuickItem
     Q_PROPERTY(QQuickItem *sourceItem READ sourceItem WRITE setSourceItem NOTIFY sourceItemChanged)
     Q_PROPERTY(int levels READ levels WRITE setLevels NOTIFY levelsChanged)
     Q_PROPERTY(bool active READ isActive NOTIFY activeChanged)
+    Q_PROPERTY(QRectF captureRect READ captureRect NOTIFY captureRectChanged)
 
 public:
     explicit OverlayBackgroundSource(QQuickItem *parent = nullptr);
@@ -29,10 +32,11 @@ public:
 
     QQuickItem *sourceItem() const { return m_sourceItem; }
     void setSourceItem(QQuickItem *item);
-    // How far the capture is scaled down and blurred: 1 (half size) to 5.
+    // How far the capture is scaled down and blurred: 1 (half size) to 5; 4 until set.
     int levels() const { return m_levels; }
     void setLevels(int levels);
     bool isActive() const { return m_active; }
+    QRectF captureRect() const { return m_captureRect; }
 
     // An overlay that shows the source while it is visible.
     void addUser(QQuickItem *user);
@@ -47,6 +51,7 @@ Q_SIGNALS:
     void sourceItemChanged();
     void levelsChanged();
     void activeChanged();
+    void captureRectChanged();
 
 protected:
     QSGNode *updatePaintNode(QSGNode *oldNode, UpdatePaintNodeData *) override;
@@ -55,13 +60,16 @@ protected:
 
 private:
     void updateActive();
+    void updateCaptureRect();
     void registerIn(QQuickWindow *window);
 
     QPointer<QQuickItem> m_sourceItem;
-    SourceLayer m_layer;
+    QQuickShaderEffectSource *m_capture = nullptr; // while active
+    QMetaObject::Connection m_frames;
+    QRectF m_captureRect;
     QSet<QQuickItem *> m_users;
     QPointer<QQuickWindow> m_registeredIn;
-    int m_levels = 3;
+    int m_levels = 4;
     bool m_active = false;
     mutable BlurEffectTextureProvider *m_provider = nullptr; // render thread
 };
