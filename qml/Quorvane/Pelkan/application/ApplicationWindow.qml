@@ -18,6 +18,12 @@ Private.Window {
     property int allowedOrientations: defaultAllowedOrientations
     default property alias content: contentArea.data
     readonly property alias contentItem: contentArea
+    // Above the pages, turned with them: where popups go. What lies under it can be shown
+    // frosted behind them (OverlayBackground.enabled), from one capture of the page stack.
+    readonly property alias overlay: overlayLayer
+    // Frames per second and frame times over the window (also for every window when
+    // PELKAN_FRAME_RATE is set).
+    property bool showFrameRate: false
     property QtWindow.Window _host: null
     property Private.CoverWindow _coverWindow: null
 
@@ -51,7 +57,20 @@ Private.Window {
             anchors.fill: parent
             _window: window
         }
+
+        // Captures only while a popup shows it.
+        Private.OverlayBackgroundSource {
+            sourceItem: stack
+        }
+
+        Item {
+            id: overlayLayer
+            anchors.fill: parent
+            z: 1000
+        }
     }
+
+    onShowFrameRateChanged: Private.Util.showFrameRate(window, showFrameRate)
 
     Component {
         id: hostComponent
@@ -102,6 +121,8 @@ Private.Window {
             stack.push(initialPage, {}, PageStackAction.Immediate)
         _makeCover()
         Qt.callLater(_ensureWindow)
+        if (showFrameRate)
+            Qt.callLater(function() { Private.Util.showFrameRate(window, true) })
     }
     Component.onDestruction: {
         if (_coverWindow)

@@ -22,6 +22,12 @@ Item {
         return null
     }
 
+    GlassBackground {
+        anchors.fill: parent
+        radius: 0
+        color: Theme.rgba(Theme.highlightBackgroundColor, 0.1)
+    }
+
     MouseArea {
         id: cancelButton
         objectName: "cancel"

@@ -14,6 +14,19 @@ Column {
     visible: false
     onVisibleChanged: if (!visible) closed()
 
+    // Glass under the menu, beside it in its parent (a column positions its children).
+    GlassBackground {
+        parent: menu.parent
+        x: menu.x
+        y: menu.y
+        z: menu.z - 0.5
+        width: menu.width
+        height: menu.height
+        visible: menu.visible
+        radius: 0
+        color: Theme.rgba(Theme.highlightBackgroundColor, 0.15)
+    }
+
     function _picked(menuItem) {
         visible = false
     }

@@ -1,5 +1,6 @@
 import QtQuick 2.6
 import Quorvane.Pelkan 1.0
+import Quorvane.Pelkan.private 1.0 as Private
 
 // "Clearing in 5 s, tap to cancel" across the top of a page: execute() starts it, the
 // action runs when the countdown ends, a tap cancels it.
@@ -11,14 +12,42 @@ MouseArea {
     readonly property bool active: countdown.running
     property var _action: null
     property double _deadline: 0
+    // Where it was declared; while counting down it shows in the window's overlay, over a
+    // frosted view of the page.
+    property Item _home: null
 
     signal triggered()
     signal canceled()
 
-    width: parent ? parent.width : 0
+    width: _home ? _home.width : (parent ? parent.width : 0)
     height: Theme.itemSizeSmall
-    visible: active
+    visible: active && (!_home || _home.visible)
     z: 100
+    Private.OverlayBackground.enabled: _home !== null
+    Private.OverlayBackground.color: Theme.rgba(Theme.highlightBackgroundColor, 0.6)
+
+    onActiveChanged: active ? _raise() : _lower()
+
+    function _raise() {
+        var window = Private.Util.findAncestor(popup, "overlay")
+        if (!window || !window.overlay || _home)
+            return
+        _home = parent
+        var at = _home.mapToItem(window.overlay, 0, 0)
+        parent = window.overlay
+        x = at.x
+        y = at.y
+    }
+
+    function _lower() {
+        if (!_home)
+            return
+        var home = _home
+        _home = null
+        parent = home
+        x = 0
+        y = 0
+    }
 
     function execute(text, action, timeout) {
         popup.text = text || ""
@@ -56,8 +85,10 @@ MouseArea {
         }
     }
 
+    // Outside a window with an overlay, a plain background.
     Rectangle {
         anchors.fill: parent
+        visible: popup._home === null
         color: Theme.highlightBackgroundColor
         opacity: 0.9
     }

@@ -18,16 +18,15 @@ Item {
         flickable: indicator.flickable
     }
 
-    Rectangle {
+    OverlayGradient {
         parent: indicator.flickable
         width: parent ? parent.width : 0
         height: Theme.paddingLarge * 2 * indicator.amount
         y: indicator._atTop ? 0 : (parent ? parent.height - height : 0)
         opacity: indicator.active ? 1 : 0
         Behavior on opacity { OpacityAnimator { duration: 200 } }
-        gradient: Gradient {
-            GradientStop { position: 0; color: indicator._atTop ? Theme.highlightColor : "transparent" }
-            GradientStop { position: 1; color: indicator._atTop ? "transparent" : Theme.highlightColor }
-        }
+        color: Theme.highlightColor
+        // Strongest at the view's edge.
+        direction: indicator._atTop ? OpacityRamp.BottomToTop : OpacityRamp.TopToBottom
     }
 }

@@ -119,6 +119,14 @@ Item {
         easing.type: Easing.OutQuad
     }
 
+    // A glow of the highlight colour, strongest at the far end of the menu.
+    OverlayGradient {
+        anchors.fill: parent
+        color: Theme.highlightBackgroundColor
+        direction: menu._pullDown ? OpacityRamp.BottomToTop : OpacityRamp.TopToBottom
+        slope: 0.3
+    }
+
     Column {
         id: column
         y: Theme.paddingLarge
