@@ -2,6 +2,7 @@ import QtQuick 2.6
 import QtQuick.Window 2.2
 import QtTest 1.2
 import Quorvane.Pelkan 1.0
+import Quorvane.Pelkan.private 1.0 as Private
 
 // The application window: orientation chosen within what it and the current page allow,
 // content turned and laid out in the turned size.
@@ -19,6 +20,15 @@ Item {
     Component {
         id: pageComponent
         Page {}
+    }
+
+    Component {
+        id: remorsePage
+        Page {
+            property alias popup: popup
+            Rectangle { anchors.fill: parent; color: "red" }
+            RemorsePopup { id: popup }
+        }
     }
 
     TestCase {
@@ -46,6 +56,25 @@ Item {
             compare(app.contentItem.width, turned ? app.height : app.width)
             compare(page.width, app.contentItem.width)
             tryCompare(app.contentItem, "rotation", Screen.angleBetween(Screen.orientation, data.expected))
+        }
+
+        // A popup counting down shows in the overlay over a frosted capture of the pages,
+        // and goes home when done; the capture stops with it.
+        function test_popupInOverlay() {
+            app.deviceOrientation = Orientation.Portrait
+            app.pageStack.clear()
+            var page = app.pageStack.push(remorsePage, {}, PageStackAction.Immediate)
+            var popup = page.popup
+            popup.execute("Clearing", function() {}, 10000)
+            compare(popup.parent, app.overlay)
+            compare(popup.width, page.width)
+            var source = popup.Private.OverlayBackground.source
+            verify(source !== null)
+            compare(popup.Private.OverlayBackground.background.backdrop, source)
+            verify(source.active)
+            popup.cancel()
+            compare(popup.parent, page)
+            verify(!source.active)
         }
     }
 }

@@ -13,6 +13,8 @@ Cover {
 
     transparent: true
 
+    CoverBackground {}
+
     Text {
         anchors.centerIn: parent
         horizontalAlignment: Text.AlignHCenter

@@ -11,7 +11,8 @@ Page {
         { name: "orientation", title: "Orientation" }, { name: "format", title: "Formatting" },
         { name: "gestures", title: "Gestures" }, { name: "cover", title: "Cover" },
         { name: "form", title: "Forms and controls" },
-        { name: "photos", title: "Photo slideshow" }, { name: "tabs", title: "Tabs" }, { name: "lists", title: "Lists and menus" }
+        { name: "photos", title: "Photo slideshow" }, { name: "tabs", title: "Tabs" }, { name: "lists", title: "Lists and menus" },
+        { name: "backgrounds", title: "Backgrounds" }
     ]
 
     function openDialog(operationType) {
@@ -54,6 +55,8 @@ Page {
                             page.pageStack.push(Qt.resolvedUrl("PhotosPage.qml"), { "photos": page._window.photos })
                         else if (modelData.name === "tabs")
                             page.pageStack.push(Qt.resolvedUrl("TabsPage.qml"))
+                        else if (modelData.name === "backgrounds")
+                            page.pageStack.push(Qt.resolvedUrl("BackgroundsPage.qml"))
                         else
                             page.pageStack.push(Qt.resolvedUrl("SubjectPage.qml"),
                                                 { "name": modelData.name, "title": modelData.title,

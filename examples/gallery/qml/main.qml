@@ -28,9 +28,10 @@ ApplicationWindow {
     Component.onCompleted: {
         if (startPage === "dialog")
             pageStack.currentPage.openDialog(PageStackAction.Immediate)
-        else if (["lists", "form", "photos", "tabs"].indexOf(startPage) >= 0)
+        else if (["lists", "form", "photos", "tabs", "backgrounds"].indexOf(startPage) >= 0)
             pageStack.push(Qt.resolvedUrl({ "lists": "ListsPage.qml", "form": "FormPage.qml",
-                                            "photos": "PhotosPage.qml", "tabs": "TabsPage.qml" }[startPage]),
+                                            "photos": "PhotosPage.qml", "tabs": "TabsPage.qml",
+                                            "backgrounds": "BackgroundsPage.qml" }[startPage]),
                            startPage === "photos" ? { "photos": photos } : {}, PageStackAction.Immediate)
         else if (startPage !== "home")
             pageStack.push(Qt.resolvedUrl("SubjectPage.qml"), { "name": startPage, "application": app },
