@@ -4,38 +4,18 @@
 
 BackgroundShapeItem::BackgroundShapeItem(QQuickItem *parent)
     : QQuickItem(parent)
+    , m_color(this, [this] { return themeColor(); },
+              [this] {
+                  update();
+                  Q_EMIT colorChanged();
+              })
+    , m_borderColor(this, [] { return Pelkan::Theme::instance()->rgba(Pelkan::Theme::instance()->primaryColor(), 0.2); },
+                    [this] {
+                        update();
+                        Q_EMIT borderColorChanged();
+                    })
 {
     setFlag(ItemHasContents);
-    // A subclass's theme colour may come from any role: redraw on each.
-    Pelkan::Theme *theme = Pelkan::Theme::instance();
-    const auto themeChanged = [this] {
-        if (!m_colorSet)
-            Q_EMIT colorChanged();
-        if (!m_borderColorSet)
-            Q_EMIT borderColorChanged();
-        update();
-    };
-    connect(theme, &Pelkan::Theme::primaryColorChanged, this, themeChanged);
-    connect(theme, &Pelkan::Theme::highlightBackgroundColorChanged, this, themeChanged);
-    connect(theme, &Pelkan::Theme::overlayBackgroundColorChanged, this, themeChanged);
-}
-
-void BackgroundShapeItem::setColor(const QColor &color)
-{
-    if (m_colorSet && color == m_color)
-        return;
-    m_color = color;
-    m_colorSet = true;
-    update();
-    Q_EMIT colorChanged();
-}
-
-void BackgroundShapeItem::resetColor()
-{
-    if (!std::exchange(m_colorSet, false))
-        return;
-    update();
-    Q_EMIT colorChanged();
 }
 
 void BackgroundShapeItem::setRadius(qreal radius)
@@ -56,31 +36,6 @@ void BackgroundShapeItem::setBorderWidth(qreal width)
     m_borderWidth = width;
     update();
     Q_EMIT borderWidthChanged();
-}
-
-QColor BackgroundShapeItem::borderColor() const
-{
-    if (m_borderColorSet)
-        return m_borderColor;
-    return Pelkan::Theme::instance()->rgba(Pelkan::Theme::instance()->primaryColor(), 0.2);
-}
-
-void BackgroundShapeItem::setBorderColor(const QColor &color)
-{
-    if (m_borderColorSet && color == m_borderColor)
-        return;
-    m_borderColor = color;
-    m_borderColorSet = true;
-    update();
-    Q_EMIT borderColorChanged();
-}
-
-void BackgroundShapeItem::resetBorderColor()
-{
-    if (!std::exchange(m_borderColorSet, false))
-        return;
-    update();
-    Q_EMIT borderColorChanged();
 }
 
 BackgroundShape BackgroundShapeItem::shape() const

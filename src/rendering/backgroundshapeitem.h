@@ -1,6 +1,7 @@
 #pragma once
 
 #include "backgroundshapenode.h"
+#include "themedcolor.h"
 
 #include <QColor>
 #include <QQuickItem>
@@ -18,16 +19,16 @@ class BackgroundShapeItem : public QQuickItem
 public:
     explicit BackgroundShapeItem(QQuickItem *parent = nullptr);
 
-    QColor color() const { return m_colorSet ? m_color : themeColor(); }
-    void setColor(const QColor &color);
-    void resetColor();
+    QColor color() const { return m_color.value(); }
+    void setColor(const QColor &color) { m_color.set(color); }
+    void resetColor() { m_color.reset(); }
     qreal radius() const { return m_radius; }
     void setRadius(qreal radius);
     qreal borderWidth() const { return m_borderWidth; }
     void setBorderWidth(qreal width);
-    QColor borderColor() const;
-    void setBorderColor(const QColor &color);
-    void resetBorderColor();
+    QColor borderColor() const { return m_borderColor.value(); }
+    void setBorderColor(const QColor &color) { m_borderColor.set(color); }
+    void resetBorderColor() { m_borderColor.reset(); }
 
 Q_SIGNALS:
     void colorChanged();
@@ -47,10 +48,8 @@ protected:
     void geometryChanged(const QRectF &newGeometry, const QRectF &oldGeometry) override;
 
 private:
-    QColor m_color;
-    QColor m_borderColor;
+    ThemedColor m_color;
+    ThemedColor m_borderColor;
     qreal m_radius = 0;
     qreal m_borderWidth = 0;
-    bool m_colorSet = false;
-    bool m_borderColorSet = false;
 };

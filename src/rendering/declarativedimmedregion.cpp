@@ -35,42 +35,13 @@ void addCorner(QVector<QPointF> &points, const QPointF &corner, const QPointF &c
 
 DeclarativeDimmedRegion::DeclarativeDimmedRegion(QQuickItem *parent)
     : QQuickItem(parent)
+    , m_color(this, [] { return Pelkan::Theme::instance()->rgba(Pelkan::Theme::instance()->overlayBackgroundColor(), 0.7); },
+              [this] {
+                  update();
+                  Q_EMIT colorChanged();
+              })
 {
     setFlag(ItemHasContents);
-    connect(Pelkan::Theme::instance(), &Pelkan::Theme::overlayBackgroundColorChanged, this, [this] {
-        if (!m_colorSet) {
-            update();
-            Q_EMIT colorChanged();
-        }
-    });
-}
-
-QColor DeclarativeDimmedRegion::color() const
-{
-    if (m_colorSet)
-        return m_color;
-    QColor overlay = Pelkan::Theme::instance()->overlayBackgroundColor();
-    overlay.setAlphaF(0.7);
-    return overlay;
-}
-
-void DeclarativeDimmedRegion::setColor(const QColor &color)
-{
-    if (m_colorSet && color == m_color)
-        return;
-    m_color = color;
-    m_colorSet = true;
-    update();
-    Q_EMIT colorChanged();
-}
-
-void DeclarativeDimmedRegion::resetColor()
-{
-    if (!m_colorSet)
-        return;
-    m_colorSet = false;
-    update();
-    Q_EMIT colorChanged();
 }
 
 void DeclarativeDimmedRegion::setHoles(const QVariantList &holes)

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "themedcolor.h"
+
 #include <QColor>
 #include <QPointer>
 #include <QQuickItem>
@@ -21,9 +23,9 @@ class DeclarativeDimmedRegion : public QQuickItem
 public:
     explicit DeclarativeDimmedRegion(QQuickItem *parent = nullptr);
 
-    QColor color() const;
-    void setColor(const QColor &color);
-    void resetColor();
+    QColor color() const { return m_color.value(); }
+    void setColor(const QColor &color) { m_color.set(color); }
+    void resetColor() { m_color.reset(); }
     QVariantList holes() const { return m_holes; }
     void setHoles(const QVariantList &holes);
     qreal radius() const { return m_radius; }
@@ -46,7 +48,6 @@ protected:
 private:
     QVariantList m_holes;
     QVector<QPointer<QQuickItem>> m_watched;
-    QColor m_color;
+    ThemedColor m_color;
     qreal m_radius = 0;
-    bool m_colorSet = false;
 };

@@ -6,37 +6,13 @@
 
 OverlayGradient::OverlayGradient(QQuickItem *parent)
     : QQuickItem(parent)
+    , m_color(this, [] { return Pelkan::Theme::instance()->overlayBackgroundColor(); },
+              [this] {
+                  update();
+                  Q_EMIT colorChanged();
+              })
 {
     setFlag(ItemHasContents);
-    connect(Pelkan::Theme::instance(), &Pelkan::Theme::overlayBackgroundColorChanged, this, [this] {
-        if (!m_colorSet) {
-            update();
-            Q_EMIT colorChanged();
-        }
-    });
-}
-
-QColor OverlayGradient::color() const
-{
-    return m_colorSet ? m_color : Pelkan::Theme::instance()->overlayBackgroundColor();
-}
-
-void OverlayGradient::setColor(const QColor &color)
-{
-    if (m_colorSet && color == m_color)
-        return;
-    m_color = color;
-    m_colorSet = true;
-    update();
-    Q_EMIT colorChanged();
-}
-
-void OverlayGradient::resetColor()
-{
-    if (!std::exchange(m_colorSet, false))
-        return;
-    update();
-    Q_EMIT colorChanged();
 }
 
 void OverlayGradient::setDirection(DeclarativeOpacityRamp::Direction direction)

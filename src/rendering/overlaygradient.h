@@ -2,6 +2,7 @@
 
 #include "declarativeopacityramp.h"
 #include "overlaygradientnode.h"
+#include "themedcolor.h"
 
 #include <QColor>
 #include <QQuickItem>
@@ -23,9 +24,9 @@ class OverlayGradient : public QQuickItem
 public:
     explicit OverlayGradient(QQuickItem *parent = nullptr);
 
-    QColor color() const;
-    void setColor(const QColor &color);
-    void resetColor();
+    QColor color() const { return m_color.value(); }
+    void setColor(const QColor &color) { m_color.set(color); }
+    void resetColor() { m_color.reset(); }
     DeclarativeOpacityRamp::Direction direction() const { return m_direction; }
     void setDirection(DeclarativeOpacityRamp::Direction direction);
     qreal offset() const { return m_offset; }
@@ -48,8 +49,7 @@ protected:
     void geometryChanged(const QRectF &newGeometry, const QRectF &oldGeometry) override;
 
 private:
-    QColor m_color;
-    bool m_colorSet = false;
+    ThemedColor m_color;
     DeclarativeOpacityRamp::Direction m_direction = DeclarativeOpacityRamp::LeftToRight;
     qreal m_offset = 0;
     qreal m_slope = 1;
