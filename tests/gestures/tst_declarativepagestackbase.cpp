@@ -43,13 +43,10 @@ private Q_SLOTS:
     void init();
     void cleanup();
 
-    void noNavigationIgnoresPresses();
+    void drag_data();
+    void drag();
     void grabbingModeCapturesThenGrabs();
-    void noGrabbingPublishesWithoutGrab();
-    void verticalMovementBlocksUntilRelease();
-    void forbiddenDirectionReanchors();
     void reversalPublishesShrinkingFirst();
-    void verticalStyle();
     void firmGrabOfAChildWins();
     void losingTheGrabCancels();
     void touchPressAnnouncedOnce_data();
@@ -121,16 +118,80 @@ void tst_DeclarativePageStackBase::record()
     connect(m_stack, &DeclarativePageStackBase::canceled, this, log("canceled"));
 }
 
-void tst_DeclarativePageStackBase::noNavigationIgnoresPresses()
+// A drag, as steps of press (p), move (m) and release (r) at x + tx * threshold,
+// y + ty * threshold: the differences after it and whether the stack holds the mouse.
+struct DragStep {
+    char kind;
+    int x, tx, y, ty;
+};
+Q_DECLARE_METATYPE(QVector<DragStep>)
+
+void tst_DeclarativePageStackBase::drag_data()
 {
-    m_stack->setBackNavigation(false);
+    QTest::addColumn<QString>("setup");
+    QTest::addColumn<QVector<DragStep>>("steps");
+    QTest::addColumn<QString>("differences");
+    QTest::addColumn<bool>("grabbed");
+    QTest::addColumn<QString>("events"); // all of them, or what they must contain
+    QTest::newRow("no navigation ignores presses")
+            << "none" << QVector<DragStep> { { 'p', 100, 0, 100, 0 }, { 'm', 300, 0, 100, 0 } }
+            << "l0 r0 u0 d0" << false << "";
+    QTest::newRow("without grabbing, published all the same")
+            << "no grabbing" << QVector<DragStep> { { 'p', 100, 0, 300, 0 }, { 'm', 101, 1, 300, 0 }, { 'm', 130, 1, 300, 0 } }
+            << "l29 r0 u0 d0" << false << "pressed l0 r0 u0 d0";
+    QTest::newRow("moving vertically first blocks the gesture")
+            << "" << QVector<DragStep> { { 'p', 100, 0, 100, 0 }, { 'm', 100, 0, 101, 1 }, { 'm', 300, 0, 101, 1 },
+                                         { 'm', 390, 0, 101, 1 } }
+            << "l0 r0 u0 d0" << false << "pressed l0 r0 u0 d0";
+    QTest::newRow("the next touch after a blocked one starts afresh")
+            << "" << QVector<DragStep> { { 'p', 100, 0, 100, 0 }, { 'm', 100, 0, 101, 1 }, { 'm', 390, 0, 101, 1 },
+                                         { 'r', 390, 0, 101, 1 }, { 'p', 100, 0, 100, 0 }, { 'm', 101, 1, 100, 0 },
+                                         { 'm', 120, 1, 100, 0 }, { 'm', 140, 1, 100, 0 } }
+            << "l20 r0 u0 d0" << true << "left l20 r0 u0 d0";
+    // Leftward while forward navigation is off: the anchor follows, then it captures from there.
+    QTest::newRow("a forbidden direction re-anchors")
+            << "" << QVector<DragStep> { { 'p', 200, 0, 300, 0 }, { 'm', 160, 0, 300, 0 }, { 'm', 161, 1, 300, 0 },
+                                         { 'm', 170, 1, 300, 0 }, { 'm', 180, 1, 300, 0 } }
+            << "l10 r0 u0 d0" << true << "left l10 r0 u0 d0";
+    QTest::newRow("vertical style, up and back down past the anchor")
+            << "vertical" << QVector<DragStep> { { 'p', 200, 0, 200, 0 }, { 'm', 200, 0, 201, 1 }, { 'm', 200, 0, 210, 1 },
+                                                 { 'm', 200, 0, 240, 1 }, { 'm', 200, 0, 200, 1 } }
+            << "l0 r0 u0 d10" << true << "up l0 r0 u30 d0";
+}
+
+void tst_DeclarativePageStackBase::drag()
+{
+    QFETCH(QString, setup);
+    QFETCH(QVector<DragStep>, steps);
+    QFETCH(QString, differences);
+    QFETCH(bool, grabbed);
+    QFETCH(QString, events);
+    m_stack->setBackNavigation(setup != QLatin1String("none"));
     m_stack->setForwardNavigation(false);
-    QVERIFY(!m_stack->handlePress(QPointF(100, 100)));
-    QVERIFY(!m_stack->handleMove(QPointF(300, 100)));
-    press(100, 100);
-    move(300, 100);
-    release(300, 100);
-    QVERIFY(m_events.isEmpty());
+    m_stack->setNoGrabbing(setup == QLatin1String("no grabbing"));
+    if (setup == QLatin1String("vertical"))
+        m_stack->setNavigationStyle(DeclarativePageNavigation::Vertical);
+    QCOMPARE(m_stack->horizontalNavigationStyle(), setup != QLatin1String("vertical"));
+    const int t = threshold();
+    QVERIFY(t < 40);
+    QPoint at;
+    for (const DragStep &step : steps) {
+        at = QPoint(step.x + step.tx * t, step.y + step.ty * t);
+        if (step.kind == 'p')
+            press(at.x(), at.y());
+        else if (step.kind == 'm')
+            move(at.x(), at.y());
+        else
+            release(at.x(), at.y());
+    }
+    QCOMPARE(QStringLiteral("l%1 r%2 u%3 d%4").arg(m_stack->leftFlickDifference()).arg(m_stack->rightFlickDifference())
+                     .arg(m_stack->upFlickDifference()).arg(m_stack->downFlickDifference()), differences);
+    QCOMPARE(m_window->mouseGrabberItem() == m_stack, grabbed);
+    if (events.isEmpty())
+        QVERIFY2(m_events.isEmpty(), qPrintable(m_events.join(QLatin1String(", "))));
+    else
+        QVERIFY2(m_events.contains(events), qPrintable(m_events.join(QLatin1String(", "))));
+    release(at.x(), at.y());
 }
 
 void tst_DeclarativePageStackBase::grabbingModeCapturesThenGrabs()
@@ -152,53 +213,6 @@ void tst_DeclarativePageStackBase::grabbingModeCapturesThenGrabs()
     QVERIFY(!m_events.join(QLatin1Char(',')).contains(QLatin1String("canceled")));
 }
 
-void tst_DeclarativePageStackBase::noGrabbingPublishesWithoutGrab()
-{
-    m_stack->setNoGrabbing(true);
-    const int t = threshold();
-    press(100, 300);
-    move(101 + t, 300);
-    move(130 + t, 300);
-    QCOMPARE(m_stack->leftFlickDifference(), 29.0f);
-    QVERIFY(m_window->mouseGrabberItem() != m_stack);
-    release(130 + t, 300);
-    QVERIFY(m_events.contains(QStringLiteral("released l29 r0 u0 d0")));
-}
-
-void tst_DeclarativePageStackBase::verticalMovementBlocksUntilRelease()
-{
-    const int t = threshold();
-    press(100, 100);
-    move(100, 101 + t);
-    // However far the finger then goes sideways, the gesture is dead.
-    move(300, 101 + t);
-    move(390, 101 + t);
-    QCOMPARE(m_stack->leftFlickDifference(), 0.0f);
-    QVERIFY(m_window->mouseGrabberItem() != m_stack);
-    release(390, 101 + t);
-
-    // The next touch starts afresh.
-    press(100, 100);
-    move(101 + t, 100);
-    move(120 + t, 100);
-    move(140 + t, 100);
-    QCOMPARE(m_stack->leftFlickDifference(), 20.0f);
-    release(140 + t, 100);
-}
-
-void tst_DeclarativePageStackBase::forbiddenDirectionReanchors()
-{
-    const int t = threshold();
-    QVERIFY(t < 40);
-    press(200, 300);
-    move(160, 300); // leftward, forward navigation is off: the anchor follows
-    move(161 + t, 300); // measured from 160, this captures
-    move(170 + t, 300);
-    move(180 + t, 300);
-    QCOMPARE(m_stack->leftFlickDifference(), 10.0f);
-    release(180 + t, 300);
-}
-
 void tst_DeclarativePageStackBase::reversalPublishesShrinkingFirst()
 {
     m_stack->setForwardNavigation(true);
@@ -215,23 +229,6 @@ void tst_DeclarativePageStackBase::reversalPublishesShrinkingFirst()
     move(240 + t, 300);
     QCOMPARE(m_events, QStringList({ QStringLiteral("right l0 r0 u0 d0"), QStringLiteral("left l30 r0 u0 d0") }));
     release(240 + t, 300);
-}
-
-void tst_DeclarativePageStackBase::verticalStyle()
-{
-    m_stack->setNavigationStyle(DeclarativePageNavigation::Vertical);
-    QVERIFY(!m_stack->horizontalNavigationStyle());
-    const int t = threshold();
-    press(200, 200);
-    move(200, 201 + t);
-    move(200, 210 + t);
-    move(200, 240 + t);
-    QCOMPARE(m_stack->upFlickDifference(), 30.0f);
-    QCOMPARE(m_stack->leftFlickDifference(), 0.0f);
-    move(200, 200 + t);
-    QCOMPARE(m_stack->upFlickDifference(), 0.0f);
-    QCOMPARE(m_stack->downFlickDifference(), 10.0f);
-    release(200, 200 + t);
 }
 
 void tst_DeclarativePageStackBase::firmGrabOfAChildWins()
