@@ -1,5 +1,6 @@
 #include "backgroundshapeshader.h"
 #include "backgroundshapematerial.h"
+#include "screenpattern.h"
 #include "shadersource.h"
 
 #include <QMatrix4x4>
@@ -56,27 +57,11 @@ void BackgroundShapeShader::updateState(const RenderState &state, QSGMaterial *n
     p->setUniformValue(m_borderColor, premultiplied(material->borderColor));
 
     QOpenGLFunctions *f = state.context()->functions();
-    QSGTexture *pattern = material->pattern;
-    // The pattern tiles across the screen: it needs a texture of its own.
-    if (pattern && pattern->isAtlasTexture())
-        pattern = pattern->removedFromAtlas();
     QSize patternSize(1, 1);
-    if (pattern && material->patternOpacity > 0) {
-        pattern->setHorizontalWrapMode(QSGTexture::Repeat);
-        pattern->setVerticalWrapMode(QSGTexture::Repeat);
-        f->glActiveTexture(GL_TEXTURE1);
-        pattern->bind();
-        patternSize = pattern->textureSize().expandedTo(QSize(1, 1));
-        p->setUniformValue(m_patternWeight, material->patternOpacity);
-    } else {
-        p->setUniformValue(m_patternWeight, 0.0f);
-    }
-    // One texel per device pixel, anchored to the screen, y pointing down.
-    const QRect viewport = state.viewportRect();
-    QMatrix4x4 patternMatrix;
-    patternMatrix.scale(1.0f / patternSize.width(), -1.0f / patternSize.height());
-    patternMatrix.scale(0.5f * viewport.width(), 0.5f * viewport.height());
-    p->setUniformValue(m_patternMatrix, patternMatrix);
+    f->glActiveTexture(GL_TEXTURE1);
+    const bool patterned = material->patternOpacity > 0 && ScreenPattern::bind(material->pattern, &patternSize);
+    p->setUniformValue(m_patternWeight, patterned ? material->patternOpacity : 0.0f);
+    p->setUniformValue(m_patternMatrix, ScreenPattern::matrix(state, patternSize));
 
     QSGTexture *backdrop = material->backdrop ? material->backdrop->texture() : nullptr;
     f->glActiveTexture(GL_TEXTURE0);

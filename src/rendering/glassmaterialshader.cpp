@@ -1,5 +1,6 @@
 #include "glassmaterialshader.h"
 #include "glassmaterial.h"
+#include "screenpattern.h"
 #include "shadersource.h"
 
 #include <QMatrix4x4>
@@ -64,30 +65,13 @@ void GlassMaterialShader::updateState(const RenderState &state, QSGMaterial *new
     if (state.isOpacityDirty())
         p->setUniformValue(m_opacity, state.opacity());
 
-    QSize textureSize(1, 1);
-    bool patterned = false;
-    if (QSGTexture *texture = glass.pattern) {
-        // The pattern tiles across the screen: it needs a texture of its own.
-        if (texture->isAtlasTexture())
-            texture = texture->removedFromAtlas();
-        if (texture) {
-            texture->setHorizontalWrapMode(QSGTexture::Repeat);
-            texture->setVerticalWrapMode(QSGTexture::Repeat);
-            state.context()->functions()->glActiveTexture(GL_TEXTURE0);
-            texture->bind();
-            textureSize = texture->textureSize().expandedTo(QSize(1, 1));
-            patterned = true;
-        }
-    }
+    QSize patternSize(1, 1);
+    state.context()->functions()->glActiveTexture(GL_TEXTURE0);
+    const bool patterned = ScreenPattern::bind(glass.pattern, &patternSize);
     // Without a pattern (not loaded, or failed) the glass reads as with a clear one, not
     // whatever texture the previous draw left bound.
     p->setUniformValue(m_patternWeight, patterned ? 1.0f : 0.0f);
-    // One texel per device pixel, anchored to the screen, y pointing down.
-    const QRect viewport = state.viewportRect();
-    QMatrix4x4 pattern;
-    pattern.scale(1.0f / textureSize.width(), -1.0f / textureSize.height());
-    pattern.scale(0.5f * viewport.width(), 0.5f * viewport.height());
-    p->setUniformValue(m_patternMatrix, pattern);
+    p->setUniformValue(m_patternMatrix, ScreenPattern::matrix(state, patternSize));
 
     p->setUniformValue(m_color, glass.color);
     p->setUniformValue(m_backgroundColor, glass.backgroundColor);
