@@ -146,7 +146,7 @@ void OverlayBackgroundSource::updateCaptureRect()
     m_captureRect = rect;
     if (m_capture && !rect.isEmpty()) {
         m_capture->setSourceRect(rect);
-        m_capture->setTextureSize(QSize(qCeil(rect.width() / 2), qCeil(rect.height() / 2)));
+        m_capture->setTextureSize(QSize(qCeil(rect.width() / 4), qCeil(rect.height() / 4)));
     }
     update();
     Q_EMIT captureRectChanged();
@@ -192,7 +192,7 @@ QSGNode *OverlayBackgroundSource::updatePaintNode(QSGNode *oldNode, UpdatePaintN
         node = new OverlayBackgroundSourceNode(BlurEffectCache::forWindow(window()));
     BlurParameters parameters;
     parameters.kernel = 1; // Gaussian9: soft enough at the lower levels
-    parameters.levels = qMax(1, m_levels - 1); // the capture is at half size already
+    parameters.levels = qMax(1, m_levels - 2); // the capture is at a quarter of the size already
     parameters.deviation = BlurKernel::derivedDeviation(parameters.kernel);
     node->pass().setSource(source);
     node->pass().setParameters(parameters);

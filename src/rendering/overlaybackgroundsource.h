@@ -13,9 +13,9 @@ class QQuickWindow;
 // it changed and shared by every overlay that shows it as a frosted backdrop (through
 // OverlayBackground or a GlassBackgroundBase's backdrop). It captures only while an overlay
 // that uses it is visible, and only the part behind those overlays (`captureRect`, in the
-// source item's coordinates), at half resolution, since the blur scales it down anyway;
-// otherwise it costs nothing. It draws nothing itself, but must be in the scene (visible)
-// to capture. The first source of a window is the one overlays use
+// source item's coordinates), at a quarter of its resolution, since the blur scales it
+// down further anyway; otherwise it costs nothing. It draws nothing itself, but must be in
+// the scene (visible) to capture. The first source of a window is the one overlays use
 // unless they name another. Overlays must not lie inside what it captures: they would
 // show themselves.
 class OverlayBackgroundSource : public QQuickItem
@@ -32,7 +32,8 @@ public:
 
     QQuickItem *sourceItem() const { return m_sourceItem; }
     void setSourceItem(QQuickItem *item);
-    // How far the capture is scaled down and blurred: 1 (half size) to 5; 4 until set.
+    // How far the capture is scaled down and blurred, each level halving it: 3 to 5 (the
+    // quarter-size capture counts as two; less is taken as 3); 4 until set.
     int levels() const { return m_levels; }
     void setLevels(int levels);
     bool isActive() const { return m_active; }
