@@ -27,12 +27,8 @@ private Q_SLOTS:
     void unknownUrisRegisterNothing();
 
     void importRegistersEveryModule();
-    void enumValues_data();
-    void enumValues();
     void uncreatableTypesFail_data();
     void uncreatableTypesFail();
-    void creatableTypes_data();
-    void creatableTypes();
     void themeSingletonPerModule();
 
 private:
@@ -79,44 +75,6 @@ void tst_Registration::importRegistersEveryModule()
         QVERIFY2(qmlTypeId(Modules[i], 1, 0, Probes[i]) >= 0, Modules[i]);
 }
 
-void tst_Registration::enumValues_data()
-{
-    QTest::addColumn<QByteArray>("expression");
-    QTest::addColumn<int>("expected");
-    QTest::newRow("PortraitMask") << QByteArray("Orientation.PortraitMask") << 5;
-    QTest::newRow("LandscapeMask") << QByteArray("Orientation.LandscapeMask") << 10;
-    QTest::newRow("PageNavigation.None") << QByteArray("PageNavigation.None") << 0;
-    QTest::newRow("NoNavigation") << QByteArray("PageNavigation.NoNavigation") << 0;
-    QTest::newRow("Direction") << QByteArray("PageNavigation.Right") << 4;
-    QTest::newRow("Style") << QByteArray("PageNavigation.Vertical") << 1;
-    QTest::newRow("PageStatus") << QByteArray("PageStatus.Deactivating") << 3;
-    QTest::newRow("DialogStatus") << QByteArray("DialogStatus.Opened") << 2;
-    QTest::newRow("DialogResult.None") << QByteArray("DialogResult.None") << 0;
-    QTest::newRow("FocusBehavior") << QByteArray("FocusBehavior.KeepFocus") << 2;
-    QTest::newRow("OpacityRamp") << QByteArray("OpacityRamp.BottomToTop") << 3;
-    QTest::newRow("TouchInteraction direction") << QByteArray("TouchInteraction.Down") << 3;
-    QTest::newRow("TruncationMode") << QByteArray("TruncationMode.Fade") << 2;
-    QTest::newRow("DateTime") << QByteArray("DateTime.TwelveHours") << 2;
-    QTest::newRow("PageStackAction") << QByteArray("PageStackAction.Pop") << 2;
-    QTest::newRow("TabViewAction") << QByteArray("TabViewAction.Immediate") << 1;
-    QTest::newRow("Dock") << QByteArray("Dock.Bottom") << 3;
-    QTest::newRow("BusyIndicatorSize") << QByteArray("BusyIndicatorSize.Large") << 3;
-    QTest::newRow("TimePickerMode") << QByteArray("Private.TimePickerMode.MinutesAndSeconds") << 1;
-}
-
-void tst_Registration::enumValues()
-{
-    QFETCH(QByteArray, expression);
-    QFETCH(int, expected);
-    QQmlComponent component(&m_engine);
-    component.setData(imports() + "QtObject { property var value: " + expression + " }\n", QUrl());
-    QScopedPointer<QObject> object(component.create());
-    QVERIFY2(object, qPrintable(component.errorString()));
-    const QVariant value = object->property("value");
-    QVERIFY2(value.isValid() && !value.isNull(), expression);
-    QCOMPARE(value.toInt(), expected);
-}
-
 void tst_Registration::uncreatableTypesFail_data()
 {
     QTest::addColumn<QByteArray>("type");
@@ -139,39 +97,6 @@ void tst_Registration::uncreatableTypesFail()
     // With an empty reason the engine gives its standard text (a reason would replace it).
     QCOMPARE(errors.first().description(), QStringLiteral("Element is not creatable."));
     QCOMPARE(errors.first().line(), 6);
-}
-
-void tst_Registration::creatableTypes_data()
-{
-    QTest::addColumn<QByteArray>("type");
-    QTest::addColumn<QByteArray>("className");
-    QTest::newRow("Palette") << QByteArray("Palette") << QByteArray("Pelkan::Palette");
-    QTest::newRow("ItemBase") << QByteArray("Private.ItemBase") << QByteArray("Pelkan::Item");
-    QTest::newRow("ControlBase") << QByteArray("Private.ControlBase") << QByteArray("Pelkan::Control");
-    QTest::newRow("Window") << QByteArray("Private.Window") << QByteArray("DeclarativeWindow");
-    QTest::newRow("Formatter") << QByteArray("Formatter") << QByteArray("DeclarativeFormatter");
-    QTest::newRow("PageStackBase") << QByteArray("PageStackBase") << QByteArray("DeclarativePageStackBase");
-    QTest::newRow("Cover") << QByteArray("Cover") << QByteArray("DeclarativeCover");
-    QTest::newRow("GlassItem") << QByteArray("GlassItem") << QByteArray("DeclarativeGlassItem");
-    QTest::newRow("PreeditText") << QByteArray("Private.PreeditText") << QByteArray("DeclarativePreeditText");
-    QTest::newRow("AutoFill") << QByteArray("Private.AutoFill") << QByteArray("AutoFill");
-    QTest::newRow("CoverAction") << QByteArray("CoverAction") << QByteArray("DeclarativeCoverAction");
-    QTest::newRow("CoverActionList") << QByteArray("CoverActionList") << QByteArray("DeclarativeCoverActionList");
-    QTest::newRow("BounceEffect") << QByteArray("BounceEffect") << QByteArray("DeclarativeBounceEffect");
-    QTest::newRow("PulleyMenuLogic") << QByteArray("Private.PulleyMenuLogic") << QByteArray("PulleyMenuLogic");
-    QTest::newRow("BlurEffect") << QByteArray("Private.BlurEffect") << QByteArray("BlurEffect");
-    QTest::newRow("FormattingProxyModel") << QByteArray("FormattingProxyModel") << QByteArray("FormattingProxyModel");
-}
-
-void tst_Registration::creatableTypes()
-{
-    QFETCH(QByteArray, type);
-    QFETCH(QByteArray, className);
-    QQmlComponent component(&m_engine);
-    component.setData(imports() + type + " {}\n", QUrl());
-    QScopedPointer<QObject> object(component.create());
-    QVERIFY2(object, qPrintable(component.errorString()));
-    QVERIFY(object->inherits(className));
 }
 
 void tst_Registration::themeSingletonPerModule()

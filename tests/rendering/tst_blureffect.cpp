@@ -64,10 +64,6 @@ void tst_BlurEffect::weights()
 void tst_BlurEffect::properties()
 {
     BlurEffect blur;
-    QCOMPARE(blur.kernel(), BlurEffect::Gaussian9);
-    QCOMPARE(blur.deviation(), 1.5f);
-    QCOMPARE(blur.levels(), 3);
-    QCOMPARE(blur.iterationBehavior(), BlurEffect::IterateLastLayer);
     QSignalSpy deviation(&blur, &BlurEffect::deviationChanged);
 
     // The kernel brings its own deviation, until one is written.
@@ -91,8 +87,6 @@ void tst_BlurEffect::properties()
     QCOMPARE(blur.levels(), 1);
     blur.setIterations(-2);
     QCOMPARE(blur.iterations(), 1);
-    blur.setIntensity(2.5f);
-    QCOMPARE(blur.intensity(), 2.5f);
 }
 
 void tst_BlurEffect::blurFollowsVisibilityUntilWritten()
