@@ -2,7 +2,7 @@
 // same inputs in the same process: relative date-times, file sizes and durations.
 // Prints calls per second for each side and the ratio (above 1: the formatter is faster).
 
-#include "declarativeformatter.h"
+#include "text/declarativeformatter.h"
 
 #include <KFormat>
 

@@ -8,7 +8,7 @@
 //   pelkan-images-bench                 runs both, printing ratios
 //   pelkan-images-bench --page KIND     one page run (theme or overlay), used by the above
 
-#include "declarativeimageprovider.h"
+#include "rendering/themeimages/declarativeimageprovider.h"
 #include "theme.h"
 #include "themeiconresolver.h"
 

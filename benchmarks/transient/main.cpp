@@ -3,7 +3,7 @@
 // each with and without QSG_TRANSIENT_IMAGES. Every variant runs in a process of its own
 // and reports its resident set once all images are on screen.
 
-#include "transientimageprovider.h"
+#include "rendering/providers/transientimageprovider.h"
 
 #include <QDir>
 #include <QFile>

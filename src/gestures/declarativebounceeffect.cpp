@@ -1,6 +1,6 @@
 #include "declarativebounceeffect.h"
-#include "declarativewindow.h"
-#include "propertycache.h"
+#include "window/declarativewindow.h"
+#include "gestures/propertycache.h"
 
 #include <QGuiApplication>
 #include <QQuickItem>

@@ -1,6 +1,6 @@
 #include "declarativedragfilter.h"
 
-#include "declarativepagenavigation.h"
+#include "enums/declarativepagenavigation.h"
 
 #include <QQuickItem>
 

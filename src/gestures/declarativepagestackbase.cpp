@@ -1,7 +1,7 @@
 #include "declarativepagestackbase.h"
-#include "declarativedragfilter.h"
-#include "pelkanlogging.h"
-#include "windowpropertypublisher.h"
+#include "gestures/declarativedragfilter.h"
+#include "core/pelkanlogging.h"
+#include "window/windowpropertypublisher.h"
 
 #include <QDir>
 #include <QLibraryInfo>

@@ -1,7 +1,7 @@
 #pragma once
 
-#include "control.h"
-#include "declarativepagenavigation.h"
+#include "core/control.h"
+#include "enums/declarativepagenavigation.h"
 
 #include <QHash>
 #include <QPointer>

@@ -1,5 +1,5 @@
 #include "dragdetectoritem.h"
-#include "declarativetouchinteraction.h"
+#include "enums/declarativetouchinteraction.h"
 
 #include <QGuiApplication>
 #include <QMouseEvent>

@@ -1,6 +1,6 @@
 #include "pulleymenulogic.h"
-#include "declarativewindow.h"
-#include "propertycache.h"
+#include "window/declarativewindow.h"
+#include "gestures/propertycache.h"
 
 #include <QQuickItem>
 

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "windoweventobserver.h"
+#include "window/windoweventobserver.h"
 
 #include <QObject>
 #include <QPointer>

@@ -1,14 +1,14 @@
 #include "quorvanepelkanplugin.h"
-#include "moduleregistration.h"
-#include "translator.h"
+#include "plugin/moduleregistration.h"
+#include "plugin/translator.h"
 
-#include "coreregistration.h"
-#include "backgroundimageprovider.h"
-#include "declarativeimageprovider.h"
-#include "screen.h"
-#include "declarativeformatter.h"
-#include "timezoneupdater.h"
-#include "transientimageprovider.h"
+#include "core/coreregistration.h"
+#include "rendering/providers/backgroundimageprovider.h"
+#include "rendering/themeimages/declarativeimageprovider.h"
+#include "core/screen.h"
+#include "text/declarativeformatter.h"
+#include "services/timezoneupdater.h"
+#include "rendering/providers/transientimageprovider.h"
 
 #include <QCoreApplication>
 #include <QLocale>

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "quorvanepelkanplugin.h"
+#include "plugin/quorvanepelkanplugin.h"
 
 #include <QTranslator>
 

@@ -1,7 +1,7 @@
 #include "declarativeconfigapi.h"
 
-#include "mgconfitem.h"
-#include "pelkanlogging.h"
+#include "platform/mgconfitem.h"
+#include "core/pelkanlogging.h"
 
 #include <QJSValue>
 #include <QQmlEngine>

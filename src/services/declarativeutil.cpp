@@ -1,7 +1,7 @@
 #include "declarativeutil.h"
-#include "framerateoverlay.h"
+#include "rendering/debug/framerateoverlay.h"
 
-#include "profilelistener.h"
+#include "services/profilelistener.h"
 
 #include <QQuickItem>
 #include <QQuickWindow>

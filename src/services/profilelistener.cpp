@@ -1,6 +1,6 @@
 #include "profilelistener.h"
 
-#include "profileclient.h"
+#include "platform/profileclient.h"
 
 #include <QCoreApplication>
 

@@ -1,5 +1,5 @@
 #include "timezoneupdater.h"
-#include "pelkanlogging.h"
+#include "core/pelkanlogging.h"
 
 #include <QFileInfo>
 #include <QFileSystemWatcher>

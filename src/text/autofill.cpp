@@ -1,6 +1,6 @@
 #include "autofill.h"
-#include "autofilldatabase.h"
-#include "inputmethodextensions.h"
+#include "text/autofilldatabase.h"
+#include "text/inputmethodextensions.h"
 
 #include <QCoreApplication>
 #include <QQmlInfo>

@@ -1,5 +1,5 @@
 #include "autofilldatabase.h"
-#include "pelkanlogging.h"
+#include "core/pelkanlogging.h"
 
 #include <QDateTime>
 #include <QDir>

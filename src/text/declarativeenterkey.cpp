@@ -1,5 +1,5 @@
 #include "declarativeenterkey.h"
-#include "inputmethodextensions.h"
+#include "text/inputmethodextensions.h"
 
 #include <QKeyEvent>
 #include <QMetaType>

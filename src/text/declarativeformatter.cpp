@@ -1,7 +1,7 @@
 #include "declarativeformatter.h"
-#include "formatterseams.h"
-#include "mgconfitem.h"
-#include "pelkanlogging.h"
+#include "text/formatterseams.h"
+#include "platform/mgconfitem.h"
+#include "core/pelkanlogging.h"
 
 #include <QLocale>
 #include <QQmlEngine>

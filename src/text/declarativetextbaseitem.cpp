@@ -1,10 +1,10 @@
 #include "declarativetextbaseitem.h"
 
-#include "declarativepreedittext.h"
-#include "declarativeunderline.h"
-#include "palette.h"
-#include "theme.h"
-#include "verticalautoscroll.h"
+#include "text/declarativepreedittext.h"
+#include "rendering/backgrounds/declarativeunderline.h"
+#include "core/palette.h"
+#include "core/theme.h"
+#include "layout/verticalautoscroll.h"
 
 #include <QQmlEngine>
 

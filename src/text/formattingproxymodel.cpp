@@ -1,5 +1,5 @@
 #include "formattingproxymodel.h"
-#include "pelkanlogging.h"
+#include "core/pelkanlogging.h"
 
 namespace {
 

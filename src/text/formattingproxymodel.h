@@ -1,6 +1,6 @@
 #pragma once
 
-#include "declarativeformatter.h"
+#include "text/declarativeformatter.h"
 
 #include <QIdentityProxyModel>
 #include <QMetaMethod>

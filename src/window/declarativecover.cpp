@@ -1,8 +1,8 @@
 #include "declarativecover.h"
-#include "declarativecoveractionarea.h"
-#include "declarativecoverwindow.h"
-#include "pelkanlogging.h"
-#include "theme.h"
+#include "window/declarativecoveractionarea.h"
+#include "window/declarativecoverwindow.h"
+#include "core/pelkanlogging.h"
+#include "core/theme.h"
 
 #include <QDBusConnection>
 #include <QDBusInterface>

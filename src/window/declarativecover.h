@@ -1,6 +1,6 @@
 #pragma once
 
-#include "control.h"
+#include "core/control.h"
 
 class DeclarativeCoverActionArea;
 class QDBusInterface;

@@ -1,5 +1,5 @@
 #include "declarativecoveractionarea.h"
-#include "theme.h"
+#include "core/theme.h"
 
 #include <cmath>
 

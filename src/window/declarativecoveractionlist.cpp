@@ -1,8 +1,8 @@
 #include "declarativecoveractionlist.h"
-#include "coveractioncaller.h"
-#include "declarativecoveraction.h"
-#include "pelkanlogging.h"
-#include "windowpropertypublisher.h"
+#include "window/coveractioncaller.h"
+#include "window/declarativecoveraction.h"
+#include "core/pelkanlogging.h"
+#include "window/windowpropertypublisher.h"
 
 #include <QCoreApplication>
 #include <QDBusConnection>

@@ -1,8 +1,8 @@
 #include "declarativecoverwindow.h"
-#include "declarativecover.h"
-#include "declarativewindow.h"
-#include "pelkanlogging.h"
-#include "windowpropertypublisher.h"
+#include "window/declarativecover.h"
+#include "window/declarativewindow.h"
+#include "core/pelkanlogging.h"
+#include "window/windowpropertypublisher.h"
 
 #include <QExposeEvent>
 

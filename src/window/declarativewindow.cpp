@@ -1,7 +1,7 @@
 #include "declarativewindow.h"
-#include "framerateoverlay.h"
-#include "pelkanlogging.h"
-#include "windowpropertypublisher.h"
+#include "rendering/debug/framerateoverlay.h"
+#include "core/pelkanlogging.h"
+#include "window/windowpropertypublisher.h"
 
 #include <QGuiApplication>
 #include <QOpenGLContext>

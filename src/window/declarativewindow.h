@@ -1,7 +1,7 @@
 #pragma once
 
-#include "control.h"
-#include "declarativeorientation.h"
+#include "core/control.h"
+#include "enums/declarativeorientation.h"
 
 #include <QColor>
 #include <QPointer>

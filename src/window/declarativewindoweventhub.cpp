@@ -1,5 +1,5 @@
-#include "declarativewindow.h"
-#include "windoweventobserver.h"
+#include "window/declarativewindow.h"
+#include "window/windoweventobserver.h"
 
 #include <QMouseEvent>
 #include <QQuickWindow>

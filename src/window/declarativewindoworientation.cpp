@@ -1,8 +1,8 @@
-#include "declarativewindow.h"
-#include "configvalue.h"
-#include "mgconfitem.h"
-#include "pelkanlogging.h"
-#include "screen.h"
+#include "window/declarativewindow.h"
+#include "platform/configvalue.h"
+#include "platform/mgconfitem.h"
+#include "core/pelkanlogging.h"
+#include "core/screen.h"
 
 #include <QGuiApplication>
 #include <QQuickWindow>

@@ -1,5 +1,5 @@
-#include "declarativewindow.h"
-#include "windowpropertypublisher.h"
+#include "window/declarativewindow.h"
+#include "window/windowpropertypublisher.h"
 
 #include <QQuickWindow>
 

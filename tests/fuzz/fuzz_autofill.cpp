@@ -1,6 +1,6 @@
 // Auto-fill keys and database operations: no key may reach a file outside the folder,
 // and what is inserted is read back.
-#include "autofilldatabase.h"
+#include "text/autofilldatabase.h"
 #include "fuzzinput.h"
 
 #include <QDir>

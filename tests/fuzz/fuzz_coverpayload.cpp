@@ -1,5 +1,5 @@
 // Reading back a window's cover-action text, whatever another list or process wrote there.
-#include "declarativecoveractionlist.h"
+#include "window/declarativecoveractionlist.h"
 #include "fuzzinput.h"
 
 #include <QUrl>

@@ -1,5 +1,5 @@
 // The formatter's operations with any numbers, dates, texts and translated patterns.
-#include "declarativeformatter.h"
+#include "text/declarativeformatter.h"
 #include "fuzzinput.h"
 
 #include <QCoreApplication>

@@ -1,9 +1,9 @@
 // Image files of any content through the three image providers, with any size asked for.
-#include "backgroundimageprovider.h"
+#include "rendering/providers/backgroundimageprovider.h"
 #include "boundedimagereader.h"
-#include "declarativeimageprovider.h"
+#include "rendering/themeimages/declarativeimageprovider.h"
 #include "fuzzinput.h"
-#include "transientimageprovider.h"
+#include "rendering/providers/transientimageprovider.h"
 
 #include <QGuiApplication>
 #include <QTemporaryDir>

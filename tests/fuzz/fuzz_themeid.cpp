@@ -2,8 +2,8 @@
 // after '?', resolved against a theme folder and tinted.
 #include "fuzzinput.h"
 #include "themeiconresolver.h"
-#include "themeimagedecoder.h"
-#include "themepixels.h"
+#include "rendering/themeimages/themeimagedecoder.h"
+#include "rendering/themeimages/themepixels.h"
 
 #include <QGuiApplication>
 #include <QImage>

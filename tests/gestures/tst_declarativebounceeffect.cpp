@@ -1,4 +1,4 @@
-#include "declarativebounceeffect.h"
+#include "gestures/declarativebounceeffect.h"
 
 #include <QGuiApplication>
 #include <QQmlEngine>

@@ -1,5 +1,5 @@
-#include "declarativepagestackbase.h"
-#include "windowpropertypublisher.h"
+#include "gestures/declarativepagestackbase.h"
+#include "window/windowpropertypublisher.h"
 
 #include <QGuiApplication>
 #include <QQmlComponent>

@@ -1,4 +1,4 @@
-#include "pulleymenulogic.h"
+#include "gestures/pulleymenulogic.h"
 
 #include <QtTest>
 

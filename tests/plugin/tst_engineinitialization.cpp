@@ -1,6 +1,6 @@
 #include "../common/pluginloader.h"
 #include "screen.h"
-#include "timezoneupdater.h"
+#include "services/timezoneupdater.h"
 
 #include <QQmlComponent>
 #include <QQmlContext>

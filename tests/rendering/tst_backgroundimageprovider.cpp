@@ -1,5 +1,5 @@
-#include "backgroundimagecache.h"
-#include "backgroundimageprovider.h"
+#include "rendering/providers/backgroundimagecache.h"
+#include "rendering/providers/backgroundimageprovider.h"
 #include "screen.h"
 #include "theme.h"
 

@@ -1,6 +1,6 @@
 #include "../common/configfixture.h"
 #include "../common/sceneview.h"
-#include "framerateoverlay.h"
+#include "rendering/debug/framerateoverlay.h"
 
 #include <QQuickItem>
 #include <QQuickView>

@@ -1,6 +1,6 @@
 #include "../common/sceneview.h"
-#include "blureffect.h"
-#include "blurkernel.h"
+#include "rendering/blur/blureffect.h"
+#include "rendering/blur/blurkernel.h"
 
 #include <QQmlEngine>
 #include <QQuickView>

@@ -1,5 +1,5 @@
 #include "../common/sceneview.h"
-#include "declarativedimmedregion.h"
+#include "rendering/backgrounds/declarativedimmedregion.h"
 
 #include <QQuickItem>
 #include <QQuickView>

@@ -1,7 +1,7 @@
 #include "../common/sceneview.h"
-#include "declarativeglassitem.h"
-#include "glassitemnode.h"
-#include "glassmaterial.h"
+#include "rendering/glass/declarativeglassitem.h"
+#include "rendering/glass/glassitemnode.h"
+#include "rendering/glass/glassmaterial.h"
 
 #include <QQmlEngine>
 #include <QQuickItem>

@@ -1,7 +1,7 @@
 #include "../common/configfixture.h"
 #include "../common/sceneview.h"
-#include "blureffectcache.h"
-#include "declarativeimageprovider.h"
+#include "rendering/blur/blureffectcache.h"
+#include "rendering/themeimages/declarativeimageprovider.h"
 #include "theme.h"
 #include "themeiconresolver.h"
 

@@ -1,6 +1,6 @@
-#include "backgroundimageprovider.h"
-#include "declarativeimageprovider.h"
-#include "transientimageprovider.h"
+#include "rendering/providers/backgroundimageprovider.h"
+#include "rendering/themeimages/declarativeimageprovider.h"
+#include "rendering/providers/transientimageprovider.h"
 
 #include <QPainter>
 #include <QSemaphore>

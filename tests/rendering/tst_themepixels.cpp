@@ -1,6 +1,6 @@
-#include "themeimagerecord.h"
-#include "themepixels.h"
-#include "themetextureatlas.h"
+#include "rendering/themeimages/themeimagerecord.h"
+#include "rendering/themeimages/themepixels.h"
+#include "rendering/themeimages/themetextureatlas.h"
 #include "themeiconresolver.h"
 
 #include <QSGTexture>

@@ -1,6 +1,6 @@
 #include "../common/sceneview.h"
-#include "transientimageprovider.h"
-#include "transientimagetexturefactory.h"
+#include "rendering/providers/transientimageprovider.h"
+#include "rendering/providers/transientimagetexturefactory.h"
 
 #include <QQmlEngine>
 #include <QQuickItem>

@@ -1,5 +1,5 @@
 #include "../common/configfixture.h"
-#include "declarativeformatter.h"
+#include "text/declarativeformatter.h"
 
 #include <QGuiApplication>
 #include <QQmlComponent>

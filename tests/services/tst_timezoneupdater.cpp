@@ -1,4 +1,4 @@
-#include "timezoneupdater.h"
+#include "services/timezoneupdater.h"
 
 #include <QFile>
 #include <QTemporaryDir>

@@ -1,5 +1,5 @@
-#include "autofill.h"
-#include "autofilldatabase.h"
+#include "text/autofill.h"
+#include "text/autofilldatabase.h"
 
 #include <QDir>
 #include <QFile>

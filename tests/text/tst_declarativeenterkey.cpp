@@ -1,5 +1,5 @@
-#include "declarativeenterkey.h"
-#include "declarativepreedittext.h"
+#include "text/declarativeenterkey.h"
+#include "text/declarativepreedittext.h"
 
 #include <QQmlComponent>
 #include <QQmlEngine>

@@ -1,6 +1,6 @@
 #include "../common/configfixture.h"
-#include "declarativeformatter.h"
-#include "formatterseams.h"
+#include "text/declarativeformatter.h"
+#include "text/formatterseams.h"
 
 #include <QTranslator>
 #include <QtTest>

@@ -1,4 +1,4 @@
-#include "declarativepreedittext.h"
+#include "text/declarativepreedittext.h"
 
 #include <QQmlComponent>
 #include <QQmlEngine>

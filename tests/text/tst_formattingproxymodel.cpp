@@ -1,6 +1,6 @@
-#include "declarativeformatter.h"
-#include "formatterseams.h"
-#include "formattingproxymodel.h"
+#include "text/declarativeformatter.h"
+#include "text/formatterseams.h"
+#include "text/formattingproxymodel.h"
 
 #include <QStandardItemModel>
 #include <QTranslator>

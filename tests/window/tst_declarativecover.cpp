@@ -1,9 +1,9 @@
-#include "declarativecover.h"
-#include "declarativecoveractionarea.h"
-#include "declarativecoverwindow.h"
-#include "declarativewindow.h"
+#include "window/declarativecover.h"
+#include "window/declarativecoveractionarea.h"
+#include "window/declarativecoverwindow.h"
+#include "window/declarativewindow.h"
 #include "theme.h"
-#include "windowpropertypublisher.h"
+#include "window/windowpropertypublisher.h"
 
 #include <QDBusConnection>
 #include <QDBusMessage>

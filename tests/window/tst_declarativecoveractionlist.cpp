@@ -1,6 +1,6 @@
-#include "declarativecoveraction.h"
-#include "declarativecoveractionlist.h"
-#include "windowpropertypublisher.h"
+#include "window/declarativecoveraction.h"
+#include "window/declarativecoveractionlist.h"
+#include "window/windowpropertypublisher.h"
 
 #include <QDBusConnection>
 #include <QDBusConnectionInterface>

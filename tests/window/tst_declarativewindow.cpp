@@ -1,8 +1,8 @@
 #include "../common/configfixture.h"
-#include "declarativewindow.h"
+#include "window/declarativewindow.h"
 #include "screen.h"
-#include "windoweventobserver.h"
-#include "windowpropertypublisher.h"
+#include "window/windoweventobserver.h"
+#include "window/windowpropertypublisher.h"
 
 #include <QQuickWindow>
 #include <QtTest>
