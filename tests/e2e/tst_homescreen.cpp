@@ -32,7 +32,7 @@ private Q_SLOTS:
     void leavesNoProcessBehind();
 
 private:
-    static QString application() { return QFINDTESTDATA("data/application.qml"); }
+    static QString application() { return QStringLiteral(PELKAN_E2E_DATA "/application.qml"); }
     // Starts a session running the application and waits until both of its windows have
     // published their properties.
     bool run(HomeScreenSession &session, const QStringList &properties);
@@ -285,7 +285,7 @@ void tst_HomeScreen::backKey()
 void tst_HomeScreen::backKeyThroughThePageStack()
 {
     HomeScreenSession session;
-    QVERIFY(session.start(QFINDTESTDATA("data/pages.qml"), {}));
+    QVERIFY(session.start(QStringLiteral(PELKAN_E2E_DATA "/pages.qml"), {}));
     QVERIFY(session.waitForLog(QStringLiteral("e2e: second page active")));
     QVERIFY(!session.waitFor([](const QJsonObject &r) {
         return r.value(QLatin1String("event")) == QLatin1String("property") && name(r) == QLatin1String("BACKGROUND_VISIBLE");
