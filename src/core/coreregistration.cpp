@@ -1,6 +1,9 @@
 #include "coreregistration.h"
+#include "buttonbase.h"
 #include "control.h"
+#include "controlbase.h"
 #include "item.h"
+#include "rangebase.h"
 #include "screen.h"
 #include "theme.h"
 
@@ -20,7 +23,10 @@ void registerPrivateTypes(const char *uri)
 {
     // Bases the toolkit's own QML components are written on.
     qmlRegisterType<Item>(uri, 1, 0, "ItemBase");
-    qmlRegisterType<Control>(uri, 1, 0, "ControlBase");
+    // Controls: behaviour here, look in the QML file completing them.
+    qmlRegisterType<ControlBase>(uri, 1, 0, "ControlBase");
+    qmlRegisterType<ButtonBase>(uri, 1, 0, "ButtonBase");
+    qmlRegisterType<RangeBase>(uri, 1, 0, "RangeBase");
 }
 
 void initializeEngine(QQmlEngine *, const char *)

@@ -47,6 +47,7 @@
 #include "core/palette.h"
 #include "core/screen.h"
 #include "core/theme.h"
+#include "core/touchfeedback.h"
 
 #include "enums/declarativebusyindicatorsize.h"
 #include "enums/declarativedatetime.h"
@@ -72,11 +73,23 @@
 namespace {
 
 template <typename T>
-void registerSingleton(const char *uri, const char *name)
+int registerSingleton(const char *uri, const char *name)
 {
-    qmlRegisterSingletonType<T>(uri, 1, 0, name, [](QQmlEngine *, QJSEngine *) -> QObject * {
+    return qmlRegisterSingletonType<T>(uri, 1, 0, name, [](QQmlEngine *, QJSEngine *) -> QObject * {
         return new T;
     });
+}
+
+// Controls play their touch tone through the engine's Util, which knows the sound profile.
+int s_utilType = -1;
+
+void playTouchFeedback(QQuickItem *pressed)
+{
+    QQmlEngine *engine = qmlEngine(pressed);
+    if (!engine || s_utilType < 0)
+        return;
+    if (auto util = engine->singletonInstance<DeclarativeUtil *>(s_utilType))
+        util->playTouchFeedback();
 }
 
 template <typename T>
@@ -151,7 +164,8 @@ void registerPrivateModule(const char *uri)
     qmlRegisterType<TextLayoutModel>(uri, 1, 0, "TextLayoutModel");
     qmlRegisterType<DragDetectorItem>(uri, 1, 0, "DragDetectorItem");
     registerUncreatable<RemorseCache>(uri, "RemorseCache");
-    registerSingleton<DeclarativeUtil>(uri, "Util");
+    s_utilType = registerSingleton<DeclarativeUtil>(uri, "Util");
+    Pelkan::TouchFeedback::setPlayer(&playTouchFeedback);
     qmlRegisterType<GlassBackground>(uri, 1, 0, "GlassBackgroundBase");
     qmlRegisterType<OverlayGradient>(uri, 1, 0, "OverlayGradientBase");
     qmlRegisterType<BlurEffect>(uri, 1, 0, "BlurEffect");

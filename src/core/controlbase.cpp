@@ -1,0 +1,167 @@
+#include "controlbase.h"
+
+#include <QGuiApplication>
+#include <QStyleHints>
+#include <QtQml/qqml.h>
+// Qt's accessible attached type is written with the emit keyword, which this build leaves out.
+#define emit Q_EMIT
+#include <private/qquickaccessibleattached_p.h>
+#undef emit
+#include <private/qqmlmetatype_p.h>
+#include <private/qquickitem_p.h>
+
+namespace Pelkan {
+
+ControlBase::ControlBase(QQuickItem *parent)
+    : Control(parent)
+{
+    setFlag(ItemIsFocusScope);
+    QAccessible::installActivationObserver(this);
+}
+
+ControlBase::~ControlBase()
+{
+    QAccessible::removeActivationObserver(this);
+}
+
+void ControlBase::setText(const QString &text)
+{
+    if (m_text == text)
+        return;
+    m_text = text;
+    if (m_accessible)
+        m_accessible->setNameImplicitly(text);
+    Q_EMIT textChanged();
+}
+
+void ControlBase::setDescription(const QString &description)
+{
+    if (m_description == description)
+        return;
+    const QString previous = m_description;
+    m_description = description;
+    // An Accessible.description the application set stays.
+    if (m_accessible && (m_accessible->description().isEmpty() || m_accessible->description() == previous))
+        m_accessible->setDescription(description);
+    Q_EMIT descriptionChanged();
+}
+
+void ControlBase::setFocusPolicy(Qt::FocusPolicy policy)
+{
+    if (m_focusPolicy == policy)
+        return;
+    m_focusPolicy = policy;
+    setActiveFocusOnTab((policy & Qt::TabFocus) == Qt::TabFocus);
+    Q_EMIT focusPolicyChanged();
+}
+
+// The effective mirroring is the item's own; it says when it changes through the item's
+// LayoutMirroring object, made on the first read (a look that never asks costs nothing).
+bool ControlBase::isMirrored() const
+{
+    ensureMirrorNotifier();
+    return QQuickItemPrivate::get(this)->isMirrored();
+}
+
+void ControlBase::ensureMirrorNotifier() const
+{
+    if (m_mirrorNotifier)
+        return;
+    m_mirrorNotifier = true;
+    // Qt Quick keeps its LayoutMirroring type to itself; it is reached as QML reaches it.
+    static const QQmlAttachedPropertiesFunc mirroringOf =
+            QQmlMetaType::qmlType(QStringLiteral("QtQuick/LayoutMirroring"), 2, 0).attachedPropertiesFunction(nullptr);
+    auto *self = const_cast<ControlBase *>(this);
+    if (QObject *mirroring = mirroringOf ? qmlAttachedPropertiesObject(self, mirroringOf, true) : nullptr)
+        connect(mirroring, SIGNAL(enabledChanged()), self, SIGNAL(mirroredChanged()));
+}
+
+int ControlBase::accessibleRole() const
+{
+    return m_accessibleRole >= 0 ? m_accessibleRole : int(defaultAccessibleRole());
+}
+
+void ControlBase::setAccessibleRole(int role)
+{
+    if (m_accessibleRole == role)
+        return;
+    m_accessibleRole = role;
+    updateAccessibleRole();
+    Q_EMIT accessibleRoleChanged();
+}
+
+void ControlBase::defaultAccessibleRoleChanged()
+{
+    if (m_accessibleRole >= 0)
+        return;
+    updateAccessibleRole();
+    Q_EMIT accessibleRoleChanged();
+}
+
+void ControlBase::updateAccessibleRole()
+{
+    if (m_accessible)
+        m_accessible->setRole(QAccessible::Role(accessibleRole()));
+}
+
+void ControlBase::accessibilityActiveChanged(bool active)
+{
+    if (!active || m_accessible || !isComponentComplete())
+        return;
+    m_accessible = qobject_cast<QQuickAccessibleAttached *>(
+            qmlAttachedPropertiesObject<QQuickAccessibleAttached>(this, true));
+    if (!m_accessible)
+        return;
+    updateAccessibleRole();
+    m_accessible->setNameImplicitly(m_text);
+    if (m_accessible->description().isEmpty())
+        m_accessible->setDescription(m_description);
+    updateAccessibleStates();
+}
+
+void ControlBase::setAccessibleState(const char *state, bool on)
+{
+    if (m_accessible)
+        static_cast<QObject *>(m_accessible)->setProperty(state, on);
+}
+
+void ControlBase::sendAccessibleValueChange(const QVariant &value)
+{
+    if (!m_accessible)
+        return;
+    QAccessibleValueChangeEvent event(this, value);
+    QAccessible::updateAccessibility(&event);
+}
+
+void ControlBase::componentComplete()
+{
+    Control::componentComplete();
+    if (QAccessible::isActive())
+        accessibilityActiveChanged(true);
+}
+
+void ControlBase::focusOnPress()
+{
+    if ((m_focusPolicy & Qt::ClickFocus) == Qt::ClickFocus && !QGuiApplication::styleHints()->setFocusOnTouchRelease())
+        forceActiveFocus(Qt::MouseFocusReason);
+}
+
+void ControlBase::focusOnRelease()
+{
+    if ((m_focusPolicy & Qt::ClickFocus) == Qt::ClickFocus && QGuiApplication::styleHints()->setFocusOnTouchRelease())
+        forceActiveFocus(Qt::MouseFocusReason);
+}
+
+void ControlBase::mousePressEvent(QMouseEvent *event)
+{
+    focusOnPress();
+    Control::mousePressEvent(event);
+}
+
+void ControlBase::mouseReleaseEvent(QMouseEvent *event)
+{
+    focusOnRelease();
+    Control::mouseReleaseEvent(event);
+}
+
+} // namespace Pelkan
