@@ -93,8 +93,9 @@ Item {
 
         function test_slider(data) {
             slider.value = 50
-            var x = slider._trackLeft + slider._trackWidth * data.at
-            mousePress(slider, slider._trackLeft + slider._trackWidth / 2, slider.height / 2)
+            var track = slider.width - slider.leftPadding - slider.rightPadding
+            var x = slider.leftPadding + track * data.at
+            mousePress(slider, slider.leftPadding + track / 2, slider.height / 2)
             mouseMove(slider, x, slider.height / 2)
             mouseRelease(slider, x, slider.height / 2)
             compare(slider.value, data.value)

@@ -102,15 +102,15 @@ Item {
             drag(data.input === "cancel" ? "touch" : data.input, 20, data.to, function() {
                 // The page follows the finger, the one below comes in from the left.
                 verify(stack._leftFlickDifference > 0)
-                compare(page._container.x, stack._leftFlickDifference)
-                compare(stack.previousPage._container.x, stack._leftFlickDifference - stack.width)
+                compare(page.parent.x, stack._leftFlickDifference)
+                compare(stack.previousPage.parent.x, stack._leftFlickDifference - stack.width)
                 if (data.input === "cancel")
                     TouchSystem.cancel(root.Window.window)
             }, data.pace)
             settle()
             compare(stack.depth, data.depth)
             compare(stack.currentPage.name, data.top)
-            compare(stack.currentPage._container.x, 0)
+            compare(stack.currentPage.parent.x, 0)
         }
 
         function test_status_data() {

@@ -9,7 +9,7 @@ import Quorvane.Pelkan.private 1.0 as Private
 Page {
     id: page
 
-    readonly property color pageColor: _window ? _window._backgroundColor : "black"
+    readonly property color pageColor: applicationWindow ? applicationWindow._backgroundColor : "black"
     readonly property string themeKeys: "/desktop/quorvane/pelkan/theme/"
 
     function setHighlight(color) {
@@ -170,8 +170,8 @@ Page {
             TextSwitch {
                 text: "Frame rate"
                 description: "Frames per second and frame times over the window"
-                checked: page._window ? page._window.showFrameRate : false
-                onCheckedChanged: if (page._window) page._window.showFrameRate = checked
+                checked: page.applicationWindow ? page.applicationWindow.showFrameRate : false
+                onCheckedChanged: if (page.applicationWindow) page.applicationWindow.showFrameRate = checked
             }
         }
     }

@@ -52,7 +52,7 @@ Page {
                         else if (modelData.name === "form")
                             page.pageStack.push(Qt.resolvedUrl("FormPage.qml"))
                         else if (modelData.name === "photos")
-                            page.pageStack.push(Qt.resolvedUrl("PhotosPage.qml"), { "photos": page._window.photos })
+                            page.pageStack.push(Qt.resolvedUrl("PhotosPage.qml"), { "photos": page.applicationWindow.photos })
                         else if (modelData.name === "tabs")
                             page.pageStack.push(Qt.resolvedUrl("TabsPage.qml"))
                         else if (modelData.name === "backgrounds")
@@ -60,7 +60,7 @@ Page {
                         else
                             page.pageStack.push(Qt.resolvedUrl("SubjectPage.qml"),
                                                 { "name": modelData.name, "title": modelData.title,
-                                                  "application": page._window })
+                                                  "application": page.applicationWindow })
                     }
                     Rectangle {
                         anchors.fill: parent

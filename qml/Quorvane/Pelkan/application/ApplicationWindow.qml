@@ -55,7 +55,7 @@ Private.Window {
         PageStack {
             id: stack
             anchors.fill: parent
-            _window: window
+            applicationWindow: window
         }
 
         // Captures only while a popup shows it.

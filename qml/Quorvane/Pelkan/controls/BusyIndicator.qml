@@ -1,16 +1,26 @@
 import QtQuick 2.6
 import Quorvane.Pelkan 1.0
+import Quorvane.Pelkan.private 1.0 as Private
 
-// A spinning ring of dots. It turns only while running and visible, so a hidden
-// indicator costs no frames.
-Item {
+/*!
+    \qmltype BusyIndicator
+    \inqmlmodule Quorvane.Pelkan
+    \brief A spinning ring of dots while something is under way.
+
+    It turns only while running and visible, so a hidden indicator costs no frames. Give it a
+    `text` to tell a screen reader what is under way.
+*/
+Private.ControlBase {
     id: indicator
 
+    /*! Whether it shows and turns. */
     property bool running
+    /*! BusyIndicatorSize.ExtraSmall, Small, Medium (default) or Large. */
     property int size: BusyIndicatorSize.Medium
-    property color color: Theme.highlightColor
-    readonly property bool _active: running && visible && opacity > 0
+    /*! The colour of the dots; the palette's highlight colour until set. */
+    property color color: palette.highlightColor
 
+    accessibleRole: Accessible.Indicator
     implicitWidth: size === BusyIndicatorSize.ExtraSmall ? Theme.iconSizeSmall * 0.75
                  : size === BusyIndicatorSize.Small ? Theme.iconSizeSmall
                  : size === BusyIndicatorSize.Large ? Theme.iconSizeLarge
@@ -44,7 +54,7 @@ Item {
             to: 360
             duration: 1000
             loops: Animation.Infinite
-            running: indicator._active
+            running: indicator.running && indicator.visible && indicator.opacity > 0
         }
     }
 }

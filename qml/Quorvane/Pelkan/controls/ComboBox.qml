@@ -1,43 +1,70 @@
 import QtQuick 2.6
 import Quorvane.Pelkan 1.0
+import Quorvane.Pelkan.private 1.0 as Private
 
-// A choice from a list: the `label` and the current `value` on one row; a tap opens the
-// choices (`model`: an array of strings or a string-list model) as a menu below, pushing
-// what follows aside, and a tap on one picks it, sets `currentIndex` and emits activated().
-Item {
+/*!
+    \qmltype ComboBox
+    \inqmlmodule Quorvane.Pelkan
+    \brief A choice from a list: the `label` and the current `value` on one row.
+
+    A tap (or Space, Enter, Return) opens the choices as a menu below, pushing what follows
+    aside; a tap on one picks it, sets `currentIndex` and emits activated(). Up and Down pick
+    the previous or next choice from the keyboard.
+*/
+Private.ButtonBase {
     id: combo
 
+    /*! What is chosen, shown before the value. */
     property string label
-    property string description
+    /*! The choices: an array of strings or a string-list model. */
     property var model: []
+    /*! The index of the chosen entry in `model`. */
     property int currentIndex: 0
+    /*! How many choices the model holds. */
     readonly property int count: !model ? 0 : (model.length !== undefined ? model.length : model.count)
-    readonly property string value: _textAt(currentIndex, count)
+    /*! The text of the chosen entry. */
+    readonly property string value: internal.textAt(currentIndex, count)
+    /*! Whether the choices are shown. */
     readonly property bool menuOpen: menu.visible
 
+    /*! A choice was picked by the user; `index` is its place in the model. */
     signal activated(int index)
 
-    function _textAt(i) {
-        if (i < 0 || i >= count)
-            return ""
-        return model.length !== undefined ? String(model[i]) : model.get(i)
+    QtObject {
+        id: internal
+        function textAt(i) {
+            if (i < 0 || i >= combo.count)
+                return ""
+            return combo.model.length !== undefined ? String(combo.model[i]) : combo.model.get(i)
+        }
+        function pick(i) {
+            if (i < 0 || i >= combo.count)
+                return
+            combo.currentIndex = i
+            combo.activated(i)
+        }
     }
 
+    text: label
+    accessibleRole: Accessible.ComboBox
     width: parent ? parent.width : implicitWidth
     implicitWidth: Theme.itemSizeExtraLarge * 3
-    height: row.height + (menu.visible ? menu.height : 0)
+    implicitHeight: row.height + (menu.visible ? menu.height : 0)
     opacity: enabled ? 1 : 0.4
 
-    MouseArea {
+    onClicked: menu.visible = !menu.visible
+    Keys.onUpPressed: internal.pick(currentIndex - 1)
+    Keys.onDownPressed: internal.pick(currentIndex + 1)
+
+    Item {
         id: row
         width: combo.width
         height: Math.max(Theme.itemSizeSmall, texts.height + 2 * Theme.paddingSmall)
-        onClicked: menu.visible = !menu.visible
 
         Rectangle {
             anchors.fill: parent
-            visible: row.pressed || menu.visible
-            color: Theme.highlightBackgroundColor
+            visible: combo.down || menu.visible
+            color: combo.palette.highlightBackgroundColor
             opacity: 0.3
         }
 
@@ -47,14 +74,15 @@ Item {
                       verticalCenter: parent.verticalCenter }
             Row {
                 spacing: Theme.paddingMedium
+                anchors { left: parent.left; right: parent.right }
                 Text {
                     text: combo.label
-                    color: row.pressed ? Theme.highlightColor : Theme.primaryColor
+                    color: combo.down ? combo.palette.highlightColor : combo.palette.primaryColor
                     font.pixelSize: Theme.fontSizeMedium
                 }
                 Text {
                     text: combo.value
-                    color: Theme.highlightColor
+                    color: combo.palette.highlightColor
                     font.pixelSize: Theme.fontSizeMedium
                 }
             }
@@ -62,7 +90,7 @@ Item {
                 visible: text !== ""
                 width: parent.width
                 text: combo.description
-                color: Theme.secondaryColor
+                color: combo.palette.secondaryColor
                 font.pixelSize: Theme.fontSizeSmall
                 wrapMode: Text.Wrap
             }
@@ -78,11 +106,8 @@ Item {
             model: combo.model
             MenuItem {
                 text: modelData
-                color: index === combo.currentIndex || highlighted ? Theme.highlightColor : Theme.primaryColor
-                onClicked: {
-                    combo.currentIndex = index
-                    combo.activated(index)
-                }
+                color: index === combo.currentIndex || highlighted ? combo.palette.highlightColor : combo.palette.primaryColor
+                onClicked: internal.pick(index)
             }
         }
     }

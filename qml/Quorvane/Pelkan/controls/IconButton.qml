@@ -2,21 +2,27 @@ import QtQuick 2.6
 import Quorvane.Pelkan 1.0
 import Quorvane.Pelkan.private 1.0 as Private
 
-// A theme icon that acts as a button: drawn in the primary colour, in the highlight
-// colour while pressed or `down`, dimmed while disabled. `iconSource` is a theme icon
-// ("image://theme/icon-m-close"); the tint is added here.
-MouseArea {
+/*!
+    \qmltype IconButton
+    \inqmlmodule Quorvane.Pelkan
+    \brief A theme icon that acts as a button.
+
+    Drawn in the palette's primary colour, in its highlight colour while `down`, dimmed while
+    disabled. Give it a `text` too: it is not drawn, but it is what a screen reader says.
+*/
+Private.ButtonBase {
     id: button
 
+    /*! A theme icon, "image://theme/icon-m-close"; the tint is added here. */
     property string iconSource
-    property bool down: pressed && containsMouse
-    property color color: Theme.primaryColor
-    property color highlightColor: Theme.highlightColor
+    /*! The icon's colour while not down. */
+    property color color: palette.primaryColor
+    /*! The icon's colour while down. */
+    property color highlightColor: palette.highlightColor
 
     implicitWidth: Theme.itemSizeSmall
     implicitHeight: Theme.itemSizeSmall
     opacity: enabled ? 1 : 0.4
-    onPressed: Private.Util.playTouchFeedback() // a touch tone at the profile's level
 
     Image {
         anchors.centerIn: parent

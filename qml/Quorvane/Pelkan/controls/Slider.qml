@@ -2,84 +2,59 @@ import QtQuick 2.6
 import Quorvane.Pelkan 1.0
 import Quorvane.Pelkan.private 1.0 as Private
 
-// A horizontal slider with a `label` under the track and `valueText` above the knob:
-// pressing or dragging anywhere on the track moves the value there, in steps of
-// `stepSize` (0 for none). Horizontal drags belong to the slider; vertical ones still
-// scroll the page. `down` while the finger is on it; `released()` when it lets go.
-MouseArea {
+/*!
+    \qmltype Slider
+    \inqmlmodule Quorvane.Pelkan
+    \brief A horizontal slider with a `label` under the track and `valueText` over the knob.
+
+    A tap on the track sets the value there, a sideways drag moves it with the finger (a drag
+    up or down scrolls the page instead); arrows, Page Up/Down, Home and End move it from the
+    keyboard. User changes snap to `stepSize` (0: none) and emit moved(); released() follows
+    the finger's lift. The value runs from `minimumValue` (also `from`) to `maximumValue`
+    (also `to`), right to left when mirrored.
+*/
+Private.RangeBase {
     id: slider
 
-    property real value: minimumValue
-    property real minimumValue: 0
-    property real maximumValue: 1
-    property real stepSize: 0
+    /*! The words under the track; also what a screen reader calls the slider. */
     property string label
+    /*! The value as the user should read it, shown over the knob; empty shows nothing. */
     property string valueText
-    readonly property bool down: pressed
-    readonly property real _progress: maximumValue > minimumValue
-                                      ? Math.max(0, Math.min(1, (value - minimumValue) / (maximumValue - minimumValue))) : 0
-    readonly property real _trackLeft: Theme.horizontalPageMargin + knob.width / 2
-    readonly property real _trackWidth: Math.max(1, width - 2 * _trackLeft)
 
-    signal released()
-
+    text: label
+    description: valueText
+    leftPadding: Theme.horizontalPageMargin + knob.width / 2
+    rightPadding: leftPadding
     width: parent ? parent.width : implicitWidth
     implicitWidth: Theme.itemSizeExtraLarge * 3
     implicitHeight: Theme.itemSizeSmall + (label !== "" ? labelText.height : 0) + (valueText !== "" ? valueLabel.height : 0)
     opacity: enabled ? 1 : 0.4
-    preventStealing: false
-
-    // Finger position to value, driven by the gesture.
-    Private.VariantInterpolator {
-        id: mapping
-        from: slider.minimumValue
-        to: slider.maximumValue
-        progress: (slider.mouseX - slider._trackLeft) / slider._trackWidth
-    }
-
-    function _setFromFinger() {
-        var v = Math.max(minimumValue, Math.min(maximumValue, mapping.value))
-        if (stepSize > 0)
-            v = minimumValue + Math.round((v - minimumValue) / stepSize) * stepSize
-        value = Math.max(minimumValue, Math.min(maximumValue, v))
-    }
-
-    onPressed: _setFromFinger()
-    onPositionChanged: {
-        // A clearly sideways drag keeps the finger from the flickable around.
-        if (!preventStealing && Math.abs(mouse.x - _pressX) > Math.abs(mouse.y - _pressY))
-            preventStealing = true
-        _setFromFinger()
-    }
-    onReleased: { preventStealing = false; slider.released() }
-    onCanceled: preventStealing = false
-    property real _pressX
-    property real _pressY
-    onPressedChanged: if (pressed) { _pressX = mouseX; _pressY = mouseY }
 
     Text {
         id: valueLabel
         visible: slider.valueText !== ""
         x: Math.max(0, Math.min(slider.width - width, knob.x + knob.width / 2 - width / 2))
         text: slider.valueText
-        color: Theme.highlightColor
+        color: slider.palette.highlightColor
         font.pixelSize: Theme.fontSizeLarge
     }
 
     Rectangle {
         id: track
-        x: slider._trackLeft
+        x: slider.leftPadding
         y: (slider.valueText !== "" ? valueLabel.height : 0) + (Theme.itemSizeSmall - height) / 2
-        width: slider._trackWidth
+        width: Math.max(1, slider.width - slider.leftPadding - slider.rightPadding)
         height: Math.max(2, Math.round(Theme.paddingSmall / 2))
         radius: height / 2
-        color: Theme.rgba(Theme.primaryColor, 0.3)
+        color: Theme.rgba(slider.palette.primaryColor, 0.3)
 
+        // Filled from the minimum's end: the left, the right when mirrored.
         Rectangle {
-            width: parent.width * slider._progress
+            x: slider.mirrored ? parent.width * slider.visualPosition : 0
+            width: parent.width * slider.position
             height: parent.height
             radius: parent.radius
-            color: Theme.highlightColor
+            color: slider.palette.highlightColor
         }
     }
 
@@ -88,21 +63,21 @@ MouseArea {
         width: Theme.paddingLarge * 1.5
         height: width
         radius: width / 2
-        x: track.x + track.width * slider._progress - width / 2
+        x: track.x + track.width * slider.visualPosition - width / 2
         y: track.y + track.height / 2 - height / 2
-        color: Theme.highlightColor
-        scale: slider.down ? 1.3 : 1
+        color: slider.palette.highlightColor
+        scale: slider.pressed ? 1.3 : 1
         Behavior on scale { NumberAnimation { duration: 100 } }
     }
 
     Text {
         id: labelText
         visible: slider.label !== ""
-        anchors.horizontalCenter: parent.horizontalCenter
+        x: (slider.width - width) / 2
         y: track.y + (Theme.itemSizeSmall + track.height) / 2
         width: Math.min(implicitWidth, slider.width - 2 * Theme.horizontalPageMargin)
         text: slider.label
-        color: slider.down ? Theme.secondaryHighlightColor : Theme.secondaryColor
+        color: slider.pressed ? slider.palette.secondaryHighlightColor : slider.palette.secondaryColor
         font.pixelSize: Theme.fontSizeSmall
         elide: Text.ElideRight
     }

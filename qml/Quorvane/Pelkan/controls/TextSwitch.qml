@@ -2,46 +2,50 @@ import QtQuick 2.6
 import Quorvane.Pelkan 1.0
 import Quorvane.Pelkan.private 1.0 as Private
 
-// A switch with a label (and an optional description under it): a tap anywhere on the
-// row flips `checked` (unless `automaticCheck` is off, for switches whose state comes from
-// elsewhere) and emits clicked(). `busy` pulses the switch while a change is applied.
-MouseArea {
+/*!
+    \qmltype TextSwitch
+    \inqmlmodule Quorvane.Pelkan
+    \brief A switch with its `text` and an optional `description` under it.
+
+    A tap anywhere on the row, or Space, Enter and Return while it is focused, flips
+    `checked` and emits toggled() and clicked(). The switch sits at the row's start: on the
+    left, on the right when mirrored.
+*/
+Private.ButtonBase {
     id: row
 
-    property alias text: label.text
-    property alias description: descriptionLabel.text
-    property bool checked
+    /*! Whether a click flips `checked`; turn it off for a switch whose state comes from
+        elsewhere (set `checked` when the change took effect). */
     property bool automaticCheck: true
+    /*! Pulses the switch while a change is being applied. */
     property bool busy: false
-    readonly property bool down: pressed && containsMouse
 
+    checkable: automaticCheck
+    accessibleRole: Accessible.CheckBox
     width: parent ? parent.width : implicitWidth
     implicitWidth: Theme.itemSizeExtraLarge * 3
     implicitHeight: Math.max(Theme.itemSizeSmall, texts.height + 2 * Theme.paddingMedium)
     opacity: enabled ? 1 : 0.4
-    onPressed: Private.Util.playTouchFeedback() // a touch tone at the profile's level
-
-    onClicked: if (automaticCheck) checked = !checked
 
     Item {
         id: indicator
-        x: Theme.horizontalPageMargin
-        anchors.verticalCenter: parent.verticalCenter
+        anchors { left: parent.left; leftMargin: Theme.horizontalPageMargin; verticalCenter: parent.verticalCenter }
         width: Theme.iconSizeMedium * 1.25
         height: Theme.iconSizeMedium * 0.6
 
         Rectangle {
             anchors.fill: parent
             radius: height / 2
-            color: row.checked ? Theme.rgba(Theme.highlightColor, 0.5) : Theme.rgba(Theme.primaryColor, 0.2)
+            color: row.checked ? Theme.rgba(row.palette.highlightColor, 0.5) : Theme.rgba(row.palette.primaryColor, 0.2)
         }
         Rectangle {
             id: knob
             width: parent.height
             height: width
             radius: width / 2
-            x: row.checked ? parent.width - width : 0
-            color: row.checked || row.down ? Theme.highlightColor : Theme.primaryColor
+            // On at the far end of the switch: the right, the left when mirrored.
+            x: row.checked !== row.mirrored ? parent.width - width : 0
+            color: row.checked || row.down ? row.palette.highlightColor : row.palette.primaryColor
             Behavior on x { NumberAnimation { duration: 120; easing.type: Easing.OutQuad } }
             SequentialAnimation on opacity {
                 running: row.busy
@@ -58,17 +62,17 @@ MouseArea {
         anchors { left: indicator.right; leftMargin: Theme.paddingLarge; right: parent.right
                   rightMargin: Theme.horizontalPageMargin; verticalCenter: parent.verticalCenter }
         Text {
-            id: label
             width: parent.width
-            color: row.down ? Theme.highlightColor : Theme.primaryColor
+            text: row.text
+            color: row.down ? row.palette.highlightColor : row.palette.primaryColor
             font.pixelSize: Theme.fontSizeMedium
             wrapMode: Text.Wrap
         }
         Text {
-            id: descriptionLabel
             visible: text !== ""
             width: parent.width
-            color: row.down ? Theme.secondaryHighlightColor : Theme.secondaryColor
+            text: row.description
+            color: row.down ? row.palette.secondaryHighlightColor : row.palette.secondaryColor
             font.pixelSize: Theme.fontSizeSmall
             wrapMode: Text.Wrap
         }

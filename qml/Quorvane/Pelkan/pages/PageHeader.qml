@@ -1,14 +1,24 @@
 import QtQuick 2.6
 import Quorvane.Pelkan 1.0
+import Quorvane.Pelkan.private 1.0 as Private
 
-// The title of a page, at its top right, with an optional description below.
-Item {
+/*!
+    \qmltype PageHeader
+    \inqmlmodule Quorvane.Pelkan
+    \brief The title of a page, at its end edge, with an optional description below.
+
+    A heading to screen readers. The title sits at the right, at the left when mirrored.
+*/
+Private.ControlBase {
     id: header
 
+    /*! The page's title. */
     property string title
-    property string description
-    property alias titleColor: titleLabel.color
+    /*! The title's colour; the palette's highlight colour until set. */
+    property color titleColor: palette.highlightColor
 
+    text: title
+    accessibleRole: Accessible.Heading
     width: parent ? parent.width : 0
     height: Math.max(Theme.itemSizeLarge, column.height + 2 * Theme.paddingMedium)
 
@@ -23,11 +33,10 @@ Item {
         }
 
         Text {
-            id: titleLabel
             width: parent.width
             horizontalAlignment: Text.AlignRight
             text: header.title
-            color: Theme.highlightColor
+            color: header.titleColor
             font.pixelSize: Theme.fontSizeLarge
             elide: Text.ElideRight
         }
@@ -36,7 +45,7 @@ Item {
             horizontalAlignment: Text.AlignRight
             visible: text.length > 0
             text: header.description
-            color: Theme.secondaryHighlightColor
+            color: header.palette.secondaryHighlightColor
             font.pixelSize: Theme.fontSizeSmall
             elide: Text.ElideRight
         }

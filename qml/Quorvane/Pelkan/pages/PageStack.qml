@@ -23,7 +23,9 @@ PageStackBase {
     readonly property real _offset: _settle + (horizontalNavigationStyle ? _leftFlickDifference - _rightFlickDifference
                                                                          : _upFlickDifference - _downFlickDifference)
     readonly property real _extent: horizontalNavigationStyle ? width : height
-    property Item _window: null
+    // The ApplicationWindow the stack belongs to (set by the window); its pages read it as
+    // Page.applicationWindow.
+    property Item applicationWindow: null
     property double _pressTime: 0
     // The clock gestures are timed by, in milliseconds; tests give their own.
     property var _now: function() { return Date.now() }
@@ -175,10 +177,6 @@ PageStackBase {
         item.visible = true
         if (item.hasOwnProperty("pageStack"))
             item.pageStack = stack
-        if (item.hasOwnProperty("_window"))
-            item._window = stack._window
-        if (item.hasOwnProperty("_container"))
-            item._container = container
         return container
     }
 
