@@ -130,9 +130,10 @@ Item {
             picker.hour = data.tag === "12 hours" ? 14 : 2 // 2 pm stays pm
             picker.minute = 0
             var wheels = []
-            for (var i = 0; i < picker.children.length; ++i)
-                if (picker.children[i].visible && picker.children[i].labels !== undefined)
-                    wheels.push(picker.children[i])
+            var row = picker.children[0]
+            for (var i = 0; i < row.children.length; ++i)
+                if (row.children[i].visible && row.children[i].labels !== undefined)
+                    wheels.push(row.children[i])
             compare(wheels.length, data.wheels)
             compare(wheels[0].count, data.mode === DateTime.TwelveHours ? 12 : 24)
             var wheel = wheels[data.wheel]

@@ -8,12 +8,15 @@ import Quorvane.Pelkan.private 1.0 as Private
 Private.QuickScrollButtonBase {
     id: button
 
-    readonly property bool _up: direction === Qt.UpArrow
+    QtObject {
+        id: internal
+        readonly property bool up: button.direction === Qt.UpArrow
+    }
 
     width: Theme.itemSizeSmall
     height: Theme.itemSizeSmall
     x: flickable ? flickable.x + flickable.width - width - Theme.paddingMedium : 0
-    y: !flickable ? 0 : _up ? flickable.y + Theme.paddingLarge : flickable.y + flickable.height - height - Theme.paddingLarge
+    y: !flickable ? 0 : internal.up ? flickable.y + Theme.paddingLarge : flickable.y + flickable.height - height - Theme.paddingLarge
     z: 50
     opacity: active ? 1 : 0
     // Tappable from the moment it starts to appear (an animator sets opacity only at its end).
@@ -28,7 +31,7 @@ Private.QuickScrollButtonBase {
     }
     Text {
         anchors.centerIn: parent
-        text: button._up ? "\u2191" : "\u2193"
+        text: internal.up ? "\u2191" : "\u2193"
         color: Theme.primaryColor
         font.pixelSize: Theme.fontSizeLarge
     }
