@@ -29,8 +29,7 @@ void ControlBase::setText(const QString &text)
     if (m_text == text)
         return;
     m_text = text;
-    if (m_accessible)
-        m_accessible->setNameImplicitly(text);
+    updateAccessibleName();
     Q_EMIT textChanged();
 }
 
@@ -113,10 +112,17 @@ void ControlBase::accessibilityActiveChanged(bool active)
     if (!m_accessible)
         return;
     updateAccessibleRole();
-    m_accessible->setNameImplicitly(m_text);
+    updateAccessibleName();
     if (m_accessible->description().isEmpty())
         m_accessible->setDescription(m_description);
     updateAccessibleStates();
+}
+
+// The text names the control unless the application named it (Accessible.name).
+void ControlBase::updateAccessibleName()
+{
+    if (m_accessible && !m_accessible->wasNameExplicitlySet())
+        m_accessible->setNameImplicitly(m_text);
 }
 
 void ControlBase::setAccessibleState(const char *state, bool on)

@@ -87,6 +87,7 @@ protected:
 private:
     void ensureMirrorNotifier() const;
     void updateAccessibleRole();
+    void updateAccessibleName();
 
     QString m_text;
     QString m_description;

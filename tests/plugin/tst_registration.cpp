@@ -30,6 +30,8 @@ private Q_SLOTS:
     void uncreatableTypesFail_data();
     void uncreatableTypesFail();
     void themeSingletonPerModule();
+    void publicTypesKeepTheirInsidesPrivate_data();
+    void publicTypesKeepTheirInsidesPrivate();
 
 private:
     QQmlEngine m_engine;
@@ -119,6 +121,56 @@ void tst_Registration::themeSingletonPerModule()
     QVERIFY(object->property("margin").toReal() > 0);
     QVERIFY(object->property("screenSingleton").value<QObject *>()->inherits("Pelkan::Screen"));
     QVERIFY(!object->property("size").toString().isEmpty());
+}
+
+// The public components show applications no underscore names of their own: internal state
+// lives in internal objects. Only the names the native types are specified with remain.
+void tst_Registration::publicTypesKeepTheirInsidesPrivate_data()
+{
+    QTest::addColumn<QByteArray>("type");
+    QFile qmldir(QFileInfo(QString::fromLocal8Bit(qgetenv("PELKAN_TEST_PLUGIN"))).dir().filePath(QStringLiteral("qmldir")));
+    QVERIFY(qmldir.open(QIODevice::ReadOnly));
+    const QRegularExpression component(QStringLiteral("^([A-Z]\\w*) 1\\.0 "));
+    while (!qmldir.atEnd()) {
+        const QRegularExpressionMatch match = component.match(QString::fromUtf8(qmldir.readLine()));
+        if (match.hasMatch())
+            QTest::newRow(qPrintable(match.captured(1))) << match.captured(1).toUtf8();
+    }
+}
+
+void tst_Registration::publicTypesKeepTheirInsidesPrivate()
+{
+    static const QSet<QByteArray> specified = {
+        "_allowedOrientations", "_allowedOrientationsChanged", "_backgroundColor", "_backgroundRect",
+        "_backgroundVisible", "_coverIsPrimaryWindow", "_coverVisible", "_currentContainer",
+        "_downFlickDifference", "_grabMouse", "_haveCoverHint", "_leftFlickDifference", "_mainWindow",
+        "_noGrabbing", "_ongoingTransitionCount", "_orientationLocked", "_orientationLockedChanged",
+        "_pageOrientation", "_persistentOpenGLContext", "_persistentSceneGraph", "_processPendingDeletions",
+        "_proxyWindow", "_rightFlickDifference", "_selectOrientation", "_setCover", "_upFlickDifference",
+        "_updateCoverVisibility", "_windowOpacity",
+    };
+    QFETCH(QByteArray, type);
+    QQmlComponent component(&m_engine);
+    component.setData(imports() + "Item {\n    property QtObject made: " + type + " {}\n}\n", QUrl());
+    QScopedPointer<QObject> holder(component.create());
+    QVERIFY2(holder, qPrintable(component.errorString()));
+    QObject *object = holder->property("made").value<QObject *>();
+    QVERIFY(object);
+    QStringList exposed;
+    const QMetaObject *meta = object->metaObject();
+    for (int i = 0; i < meta->propertyCount(); ++i) {
+        const QByteArray name = meta->property(i).name();
+        if (name.startsWith('_') && !specified.contains(name))
+            exposed << QString::fromLatin1(name);
+    }
+    for (int i = 0; i < meta->methodCount(); ++i) {
+        const QByteArray name = meta->method(i).name();
+        if (name.startsWith('_') && !name.startsWith("_q_") && !specified.contains(name))
+            exposed << QString::fromLatin1(name) + QStringLiteral("()");
+    }
+    exposed.removeDuplicates();
+    QVERIFY2(exposed.isEmpty(), qPrintable(exposed.join(QStringLiteral(", "))));
+    delete object;
 }
 
 QTEST_MAIN(tst_Registration)

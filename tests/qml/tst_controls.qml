@@ -3,9 +3,10 @@ import QtTest 1.2
 import Quorvane.Pelkan 1.0
 import Quorvane.Pelkan.private 1.0 as Private
 
-// Controls with real taps and drags: buttons laid out in rows, switch, slider steps, a
-// combo box choice, time picker wheels in 12- and 24-hour modes; and the value mixing and
-// string-list models they are built on.
+// Controls with real keys, taps and drags: keys of each control (also mirrored), Tab order,
+// presses, press-and-hold, checkable and repeating buttons, the slider under a finger in a
+// flickable, the palette a page hands down; buttons laid out in rows, time picker wheels in
+// 12- and 24-hour modes, and the value mixing and string-list models they are built on.
 Item {
     id: root
     width: 480
@@ -21,18 +22,40 @@ Item {
         Item { id: b2; implicitWidth: 80; implicitHeight: 30 }
     }
 
-    Column {
+    Page {
+        id: page
         y: 100
         width: root.width
-        TextSwitch { id: toggle; text: "Wi-Fi" }
-        Slider { id: slider; minimumValue: 0; maximumValue: 100; stepSize: 25 }
-        ComboBox { id: combo; label: "Colour"; model: ["Red", "Green", "Blue"] }
-        TimePicker { id: picker; hourMode: DateTime.TwentyFourHours }
+        height: 1200
+
+        Column {
+            id: controls
+            width: root.width
+            LayoutMirroring.childrenInherit: true
+            PageHeader { id: header; title: "Controls" }
+            Private.ButtonBase { id: plain; width: 100; height: 50 }
+            Button { id: button; text: "Send" }
+            TextSwitch { id: toggle; text: "Wi-Fi" }
+            Slider { id: slider; minimumValue: 0; maximumValue: 100; stepSize: 25 }
+            ComboBox { id: combo; label: "Colour"; model: ["Red", "Green", "Blue"] }
+            TimePicker { id: picker; hourMode: DateTime.TwentyFourHours }
+            IconButton { id: iconButton; text: "Close"; iconSource: "image://theme/icon-m-close" }
+            BusyIndicator { id: busy }
+        }
+    }
+
+    Flickable {
+        id: flick
+        y: 1400
+        width: root.width
+        height: 300
+        contentHeight: 2000
+        Slider { id: flickSlider; y: 100; minimumValue: 0; maximumValue: 100; stepSize: 25 }
     }
 
     Private.VariantInterpolator { id: mix }
     Private.StringListModel { id: strings; strings: ["a", "b", "c"] }
-    ListView { id: view; width: 100; height: 400; model: strings; delegate: Text { height: 20; text: display } }
+    ListView { id: view; y: 1710; width: 100; height: 80; model: strings; delegate: Text { height: 20; text: display } }
 
     TestCase {
         name: "Controls"
@@ -68,37 +91,189 @@ Item {
             b1.visible = true
         }
 
-        function test_switch_data() {
-            return [ { tag: "automatic", automatic: true, checked: true }, { tag: "left to the app", automatic: false, checked: false } ]
+        // The keys of a focused control, with what each must do; also right to left.
+        function test_keys_data() {
+            var rows = [
+                { tag: "button: Space", control: "button", key: Qt.Key_Space, clicked: 1 },
+                { tag: "button: Return", control: "button", key: Qt.Key_Return, clicked: 1 },
+                { tag: "button: Enter", control: "button", key: Qt.Key_Enter, clicked: 1 },
+                { tag: "button: a letter does nothing", control: "button", key: Qt.Key_A, clicked: 0 },
+                { tag: "switch: Space flips it", control: "toggle", key: Qt.Key_Space, clicked: 1, checked: true },
+                { tag: "switch left to the app: Space", control: "toggle", key: Qt.Key_Space, manual: true, clicked: 1, checked: false },
+                { tag: "slider: Right", control: "slider", key: Qt.Key_Right, value: 75 },
+                { tag: "slider: Left", control: "slider", key: Qt.Key_Left, value: 25 },
+                { tag: "slider: Up", control: "slider", key: Qt.Key_Up, value: 75 },
+                { tag: "slider: Down", control: "slider", key: Qt.Key_Down, value: 25 },
+                { tag: "slider: Page Up", control: "slider", key: Qt.Key_PageUp, value: 75 },
+                { tag: "slider: Home", control: "slider", key: Qt.Key_Home, value: 0 },
+                { tag: "slider: End", control: "slider", key: Qt.Key_End, value: 100 },
+                { tag: "combo: Space opens it", control: "combo", key: Qt.Key_Space, clicked: 1, menuOpen: true },
+                { tag: "combo: Down picks the next", control: "combo", key: Qt.Key_Down, currentIndex: 1 },
+                { tag: "combo: Up at the first stays", control: "combo", key: Qt.Key_Up, currentIndex: 0 },
+            ]
+            // Mirrored, the arrows along the track swap; nothing else changes.
+            var mirrored = rows.map(function(row) {
+                var copy = JSON.parse(JSON.stringify(row))
+                copy.tag = "mirrored " + row.tag
+                copy.mirrored = true
+                if (row.key === Qt.Key_Right || row.key === Qt.Key_Left)
+                    copy.value = 100 - row.value
+                return copy
+            })
+            return rows.concat(mirrored)
         }
 
-        function test_switch(data) {
+        function test_keys(data) {
+            var control = { button: button, toggle: toggle, slider: slider, combo: combo }[data.control]
+            controls.LayoutMirroring.enabled = !!data.mirrored
+            compare(control.mirrored, !!data.mirrored)
             toggle.checked = false
-            toggle.automaticCheck = data.automatic
-            var clicked = 0
-            toggle.clicked.connect(function() { ++clicked })
-            mouseClick(toggle)
-            compare(toggle.checked, data.checked)
-            compare(clicked, 1)
+            toggle.automaticCheck = !data.manual
+            slider.value = 50
+            combo.currentIndex = 0
+            var seen = { clicked: 0, moved: 0, activated: [] }
+            var count = function(name) { return function(i) { name === "activated" ? seen.activated.push(i) : ++seen[name] } }
+            var connections = [[control.clicked, count("clicked")], [control.moved, count("moved")],
+                               [control.activated, count("activated")]].filter(function(c) { return !!c[0] })
+            connections.forEach(function(c) { c[0].connect(c[1]) })
+            control.forceActiveFocus()
+            keyClick(data.key)
+            connections.forEach(function(c) { c[0].disconnect(c[1]) })
+            if (data.clicked !== undefined)
+                compare(seen.clicked, data.clicked)
+            if (data.checked !== undefined)
+                compare(toggle.checked, data.checked)
+            if (data.value !== undefined) {
+                compare(slider.value, data.value)
+                compare(seen.moved, data.value === 50 ? 0 : 1)
+            }
+            if (data.menuOpen !== undefined)
+                compare(combo.menuOpen, data.menuOpen)
+            if (data.currentIndex !== undefined) {
+                compare(combo.currentIndex, data.currentIndex)
+                compare(seen.activated, data.currentIndex ? [data.currentIndex] : [])
+            }
+            combo.menuOpen && mouseClick(combo, combo.width / 2, Theme.itemSizeSmall / 2)
+            controls.LayoutMirroring.enabled = false
         }
 
-        function test_slider_data() {
+        // Tab and Shift+Tab walk the controls in order; a tap does not take the focus.
+        function test_tab() {
+            button.forceActiveFocus()
+            var order = [button, toggle, slider, combo]
+            for (var i = 1; i < order.length; ++i) {
+                keyClick(Qt.Key_Tab)
+                verify(order[i].activeFocus, "Tab to " + i)
+            }
+            keyClick(Qt.Key_Backtab)
+            verify(slider.activeFocus)
+            mouseClick(button)
+            verify(slider.activeFocus)
+        }
+
+        // Presses of a button: what a click, a held press, a checkable button, a repeating
+        // one and a finger that leaves give.
+        function test_press_data() {
+            var hold = Qt.styleHints.mousePressAndHoldInterval + 200
             return [
-                { tag: "start", at: 0, value: 0 },
-                { tag: "just under a step", at: 0.36, value: 25 },
-                { tag: "just over half a step", at: 0.63, value: 75 },
-                { tag: "past the end", at: 1.2, value: 100 },
+                { tag: "click", clicked: 1 },
+                { tag: "held, handled: no click", hold: hold, handler: true, held: 1, clicked: 0 },
+                { tag: "held, not handled: a click", hold: hold, clicked: 1 },
+                { tag: "checkable", checkable: true, clicked: 1, toggled: 1 },
+                { tag: "repeating", repeat: true, hold: 650, atLeast: 3 }, // every 100 ms after 300 ms, and the release
+                { tag: "finger leaves", leave: true, clicked: 0, canceled: 1 },
             ]
         }
 
-        function test_slider(data) {
-            slider.value = 50
-            var track = slider.width - slider.leftPadding - slider.rightPadding
-            var x = slider.leftPadding + track * data.at
-            mousePress(slider, slider.leftPadding + track / 2, slider.height / 2)
-            mouseMove(slider, x, slider.height / 2)
-            mouseRelease(slider, x, slider.height / 2)
-            compare(slider.value, data.value)
+        function test_press(data) {
+            var seen = { clicked: 0, pressAndHold: 0, toggled: 0, canceled: 0 }
+            var counters = {}
+            Object.keys(seen).forEach(function(name) {
+                if (name === "pressAndHold" && !data.handler)
+                    return
+                counters[name] = function() { ++seen[name] }
+                plain[name].connect(counters[name])
+            })
+            plain.checkable = !!data.checkable
+            plain.checked = false
+            plain.autoRepeat = !!data.repeat
+            mousePress(plain)
+            verify(plain.pressed && plain.down)
+            if (data.leave)
+                mouseMove(plain, plain.width * 3, plain.height / 2)
+            if (data.hold)
+                wait(data.hold)
+            mouseRelease(plain, data.leave ? plain.width * 3 : plain.width / 2, plain.height / 2)
+            Object.keys(counters).forEach(function(name) { plain[name].disconnect(counters[name]) })
+            verify(!plain.pressed && !plain.down)
+            if (data.atLeast)
+                verify(seen.clicked >= data.atLeast, seen.clicked + " clicks")
+            else
+                compare(seen.clicked, data.clicked)
+            compare(seen.pressAndHold, data.held || 0)
+            compare(seen.toggled, data.toggled || 0)
+            compare(plain.checked, !!data.toggled)
+            compare(seen.canceled, data.canceled || 0)
+        }
+
+        // A tap sets the slider where it lands (also after an earlier press elsewhere); a
+        // sideways drag moves it and is released, one up or down scrolls the page instead.
+        function test_sliderPointer_data() {
+            var rows = []
+            ;["mouse", "touch"].forEach(function(input) {
+                rows.push({ tag: input + ": taps", input: input, taps: [0.2, 0.8], value: 75, released: 2 },
+                          { tag: input + ": drag sideways", input: input, from: 0.5, to: 0.9, value: 100, released: 1 },
+                          { tag: input + ": drag down scrolls", input: input, from: 0.5, down: 200, value: 50, released: 0, scrolls: true })
+            })
+            return rows
+        }
+
+        function test_sliderPointer(data) {
+            flick.contentY = 0
+            flickSlider.value = 50
+            var track = flickSlider.width - flickSlider.leftPadding - flickSlider.rightPadding
+            var at = function(p) { return flickSlider.leftPadding + track * p }
+            var y = flickSlider.height / 2
+            var released = 0
+            var count = function() { ++released }
+            flickSlider.released.connect(count)
+            var press = function(x, y) { data.input === "touch" ? touchEvent(flickSlider).press(0, flickSlider, x, y).commit() : mousePress(flickSlider, x, y) }
+            var move = function(x, y) { data.input === "touch" ? touchEvent(flickSlider).move(0, flickSlider, x, y).commit() : mouseMove(flickSlider, x, y) }
+            var release = function(x, y) { data.input === "touch" ? touchEvent(flickSlider).release(0, flickSlider, x, y).commit() : mouseRelease(flickSlider, x, y) }
+            if (data.taps) {
+                data.taps.forEach(function(p) { press(at(p), y); release(at(p), y) })
+            } else {
+                var x = at(data.from)
+                press(x, y)
+                for (var i = 1; i <= 10; ++i)
+                    move(data.to !== undefined ? x + (at(data.to) - x) * i / 10 : x, y + (data.down || 0) * i / 10)
+                release(data.to !== undefined ? at(data.to) : x, y + (data.down || 0))
+            }
+            flickSlider.released.disconnect(count)
+            compare(flickSlider.value, data.value)
+            compare(released, data.released)
+            if (data.scrolls)
+                verify(flick.contentY < 0 || flick.dragging || flick.moving, "the page scrolled")
+            else
+                compare(flick.contentY, 0)
+        }
+
+        // A colour set on the page reaches each control on it, and a reset goes back to the theme.
+        function test_palette_data() {
+            return ["button", "iconButton", "toggle", "slider", "combo", "busy", "header", "picker"].map(function(name) {
+                return { tag: name, control: name }
+            })
+        }
+
+        function test_palette(data) {
+            var control = { button: button, iconButton: iconButton, toggle: toggle, slider: slider, combo: combo,
+                            busy: busy, header: header, picker: picker }[data.control]
+            page.palette.highlightColor = "#123456"
+            compare(String(control.palette.highlightColor), "#123456")
+            if (data.control === "button")
+                compare(String(button.highlightColor), "#123456")
+            page.palette.highlightColor = undefined
+            compare(String(control.palette.highlightColor), String(Theme.highlightColor))
         }
 
         function test_comboBox() {
