@@ -23,6 +23,17 @@ Item {
     }
 
     Component {
+        id: windowComponent
+        ApplicationWindow { anchors.fill: parent; initialPage: pageComponent }
+    }
+
+    Component {
+        id: coverComponent
+        Cover {}
+    }
+    Cover { id: coverItem }
+
+    Component {
         id: remorsePage
         Page {
             property alias popup: popup
@@ -51,11 +62,53 @@ Item {
             app.deviceOrientation = data.device
             compare(app.orientation, data.expected)
             compare(page.orientation, data.expected)
-            // Turned against the display, the content swaps its sides.
-            var turned = Screen.angleBetween(Screen.orientation, data.expected) % 180 !== 0
+            // Turned against the display, the content swaps its sides. (On this desktop the
+            // display shows the screen's shape upright.)
+            var turned = Screen.angleBetween(Screen.primaryOrientation, data.expected) % 180 !== 0
             compare(app.contentItem.width, turned ? app.height : app.width)
             compare(page.width, app.contentItem.width)
-            tryCompare(app.contentItem, "rotation", Screen.angleBetween(Screen.orientation, data.expected))
+            tryCompare(app.contentItem, "rotation", Screen.angleBetween(Screen.primaryOrientation, data.expected))
+        }
+
+        // On a desktop the page is upright in the screen's shape, and says so; an orientation
+        // the screen's shape is not turns the content.
+        function test_orientationMatchesWhatShows_data() {
+            var portraitScreen = Screen.height > Screen.width
+            var shape = portraitScreen ? Orientation.Portrait : Orientation.Landscape
+            var other = portraitScreen ? Orientation.Landscape : Orientation.Portrait
+            return [
+                { tag: "all allowed: the screen's shape", allowed: Orientation.All, expected: shape, turned: false },
+                { tag: "only the other shape: turned", allowed: other, expected: other, turned: true },
+            ]
+        }
+
+        function test_orientationMatchesWhatShows(data) {
+            var made = windowComponent.createObject(root, { "allowedOrientations": data.allowed })
+            var page = made.pageStack.currentPage
+            compare(made.orientation, data.expected)
+            compare(page.isPortrait, data.expected === Orientation.Portrait)
+            tryVerify(function() { return made.contentItem.rotation % 180 === (data.turned ? 90 : 0) })
+            compare(page.width > page.height, page.isLandscape)
+            made.destroy()
+        }
+
+        // The home screen is told there is a cover whenever one is given, and not once it goes.
+        function test_coverHint_data() {
+            return [
+                { tag: "a component", cover: coverComponent },
+                { tag: "a cover item", cover: coverItem },
+            ]
+        }
+
+        function test_coverHint(data) {
+            var made = windowComponent.createObject(root, { "cover": data.cover })
+            verify(made._haveCoverHint)
+            made.cover = null
+            verify(!made._haveCoverHint)
+            made.cover = data.cover
+            verify(made._haveCoverHint)
+            made.destroy()
+            wait(0)
         }
 
         // A popup counting down shows in the overlay over a frosted capture of the pages,
