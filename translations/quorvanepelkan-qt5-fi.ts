@@ -509,6 +509,16 @@
         <extracomment>Label under a password field</extracomment>
         <translation>Salasana</translation>
     </message>
+    <message id="quorvanepelkan-la-show-password">
+        <source>Show password</source>
+        <extracomment>Accessible name of the button beside a password field that shows the text</extracomment>
+        <translation>Näytä salasana</translation>
+    </message>
+    <message id="quorvanepelkan-la-clear-search">
+        <source>Clear search</source>
+        <extracomment>Accessible name of the button in a search field that clears the text</extracomment>
+        <translation>Tyhjennä haku</translation>
+    </message>
     <message id="quorvanepelkan-ph-search">
         <source>Search</source>
         <extracomment>Placeholder of an empty search field</extracomment>

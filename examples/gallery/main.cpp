@@ -30,7 +30,7 @@ int main(int argc, char *argv[])
                                         QStringLiteral("file"));
     parser.addOption(screenshot);
     const QCommandLineOption page(QStringLiteral("page"),
-                                  QStringLiteral("Open on <page>: home, theme, images, orientation, format, gestures, cover, form, dialog, lists, photos, tabs, backgrounds."),
+                                  QStringLiteral("Open on <page>: home, theme, images, orientation, format, gestures, cover, form, dialog, lists, search, photos, tabs, backgrounds."),
                                   QStringLiteral("page"), QStringLiteral("home"));
     parser.addOption(page);
     parser.process(app);

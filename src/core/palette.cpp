@@ -20,6 +20,8 @@ void (Palette::*Palette::colorSignal(Theme::ColorRole role))()
         &Palette::secondaryHighlightColorChanged,
         &Palette::highlightBackgroundColorChanged,
         &Palette::overlayBackgroundColorChanged,
+        &Palette::errorColorChanged,
+        &Palette::backgroundColorChanged,
     };
     return notifiers[role];
 }

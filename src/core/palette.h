@@ -20,6 +20,8 @@ class Palette : public QObject
     Q_PROPERTY(QColor secondaryHighlightColor READ secondaryHighlightColor WRITE setSecondaryHighlightColor RESET resetSecondaryHighlightColor NOTIFY secondaryHighlightColorChanged)
     Q_PROPERTY(QColor highlightBackgroundColor READ highlightBackgroundColor WRITE setHighlightBackgroundColor RESET resetHighlightBackgroundColor NOTIFY highlightBackgroundColorChanged)
     Q_PROPERTY(QColor overlayBackgroundColor READ overlayBackgroundColor WRITE setOverlayBackgroundColor RESET resetOverlayBackgroundColor NOTIFY overlayBackgroundColorChanged)
+    Q_PROPERTY(QColor errorColor READ errorColor WRITE setErrorColor RESET resetErrorColor NOTIFY errorColorChanged)
+    Q_PROPERTY(QColor backgroundColor READ backgroundColor WRITE setBackgroundColor RESET resetBackgroundColor NOTIFY backgroundColorChanged)
     Q_PROPERTY(Pelkan::Theme::ColorScheme colorScheme READ colorScheme WRITE setColorScheme RESET resetColorScheme NOTIFY colorSchemeChanged)
 
 public:
@@ -48,6 +50,12 @@ public:
     QColor overlayBackgroundColor() const { return color(Theme::OverlayBackgroundColor); }
     void setOverlayBackgroundColor(const QColor &c) { setColor(Theme::OverlayBackgroundColor, c); }
     void resetOverlayBackgroundColor() { resetColor(Theme::OverlayBackgroundColor); }
+    QColor errorColor() const { return color(Theme::ErrorColor); }
+    void setErrorColor(const QColor &c) { setColor(Theme::ErrorColor, c); }
+    void resetErrorColor() { resetColor(Theme::ErrorColor); }
+    QColor backgroundColor() const { return color(Theme::BackgroundColor); }
+    void setBackgroundColor(const QColor &c) { setColor(Theme::BackgroundColor, c); }
+    void resetBackgroundColor() { resetColor(Theme::BackgroundColor); }
 
     Theme::ColorScheme colorScheme() const;
     void setColorScheme(Theme::ColorScheme scheme);
@@ -64,6 +72,8 @@ Q_SIGNALS:
     void secondaryHighlightColorChanged();
     void highlightBackgroundColorChanged();
     void overlayBackgroundColorChanged();
+    void errorColorChanged();
+    void backgroundColorChanged();
     void colorSchemeChanged();
 
 private Q_SLOTS:

@@ -7,6 +7,7 @@
 #include <QCoreApplication>
 #include <QDir>
 #include <QFileInfo>
+#include <QHash>
 #include <QPointer>
 #include <QtMath>
 
@@ -23,6 +24,8 @@ const char *const ColorKeys[Theme::ColorRoleCount] = {
     "secondary_highlight_color",
     "highlight_background_color",
     "overlay_background_color",
+    "error_color",
+    "background_color",
 };
 
 // Opacity of the secondary colours when they are derived from the primary ones.
@@ -36,6 +39,84 @@ QColor withAlpha(QColor color, qreal alpha)
 
 } // namespace
 
+class Theme::Configuration : public QObject
+{
+public:
+    static Configuration *instance();
+    ~Configuration() override;
+
+    const State &state() const { return m_state; }
+    void attach(Theme *theme) { m_themes.append(theme); }
+    void detach(Theme *theme) { m_themes.removeOne(theme); }
+
+private:
+    Configuration();
+    void reload();
+    State readState() const;
+    qreal readPixelRatio() const;
+    ColorScheme readScheme() const;
+    QColor readColor(ColorRole role, const QColor &fallback) const;
+    QString readDirectory() const;
+    // Whether a refused value of item is new, so worth a warning; forgetRefusal() when the
+    // key holds a good value again.
+    bool isNewRefusal(const MGConfItem *item, const QVariant &value) const;
+    void forgetRefusal(const MGConfItem *item) const;
+
+    QVector<MGConfItem *> m_colorConfig;
+    MGConfItem *m_pixelRatioConfig;
+    MGConfItem *m_schemeConfig;
+    MGConfItem *m_directoryConfig;
+    State m_state;
+    QVector<Theme *> m_themes;
+    mutable QHash<QString, QVariant> m_refused; // key -> the value last warned about
+};
+
+Theme::Configuration *Theme::Configuration::instance()
+{
+    // Lives with the application; made again should another come.
+    static QPointer<Configuration> s_configuration;
+    if (!s_configuration)
+        s_configuration = new Configuration;
+    return s_configuration;
+}
+
+Theme::Configuration::Configuration()
+    : QObject(QCoreApplication::instance())
+{
+    auto watch = [this](const char *name) {
+        auto item = new MGConfItem(configurationPath() + QLatin1String(name), this);
+        connect(item, &MGConfItem::valueChanged, this, &Configuration::reload);
+        return item;
+    };
+    m_pixelRatioConfig = watch("pixel_ratio");
+    m_schemeConfig = watch("color_scheme");
+    m_directoryConfig = watch("directory");
+    for (const char *key : ColorKeys)
+        m_colorConfig.append(watch(key));
+
+    connect(Screen::instance(), &Screen::geometryChanged, this, &Configuration::reload);
+    m_state = readState();
+}
+
+Theme::Configuration::~Configuration()
+{
+    // Themes that outlive it keep the values they last had.
+    for (Theme *theme : qAsConst(m_themes)) {
+        theme->m_detached = m_state;
+        theme->m_state = &theme->m_detached;
+    }
+}
+
+void Theme::Configuration::reload()
+{
+    const State old = m_state;
+    m_state = readState();
+    // Every theme holds the new values before the first one announces them.
+    const QVector<Theme *> themes = m_themes;
+    for (Theme *theme : themes)
+        theme->announce(old);
+}
+
 Theme *Theme::instance()
 {
     static QPointer<Theme> s_instance;
@@ -47,22 +128,16 @@ Theme *Theme::instance()
 Theme::Theme(QObject *parent)
     : QObject(parent)
 {
-    auto watch = [this](const char *name) {
-        auto item = new MGConfItem(configurationPath() + QLatin1String(name), this);
-        connect(item, &MGConfItem::valueChanged, this, &Theme::reload);
-        return item;
-    };
-    m_pixelRatioConfig = watch("pixel_ratio");
-    m_schemeConfig = watch("color_scheme");
-    m_directoryConfig = watch("directory");
-    for (const char *key : ColorKeys)
-        m_colorConfig.append(watch(key));
-
-    connect(Screen::instance(), &Screen::geometryChanged, this, &Theme::reload);
-    m_state = readState();
+    Configuration *configuration = Configuration::instance();
+    configuration->attach(this);
+    m_state = &configuration->state();
 }
 
-Theme::~Theme() = default;
+Theme::~Theme()
+{
+    if (m_state != &m_detached)
+        Configuration::instance()->detach(this);
+}
 
 QString Theme::configurationPath()
 {
@@ -78,13 +153,15 @@ void (Theme::*Theme::colorSignal(ColorRole role))()
         &Theme::secondaryHighlightColorChanged,
         &Theme::highlightBackgroundColorChanged,
         &Theme::overlayBackgroundColorChanged,
+        &Theme::errorColorChanged,
+        &Theme::backgroundColorChanged,
     };
     return notifiers[role];
 }
 
 QSize Theme::scaledSize(int width, int height) const
 {
-    return QSize(qRound(width * m_state.pixelRatio), qRound(height * m_state.pixelRatio));
+    return QSize(qRound(width * m_state->pixelRatio), qRound(height * m_state->pixelRatio));
 }
 
 QColor Theme::rgba(const QColor &color, qreal opacity) const
@@ -110,24 +187,22 @@ QString Theme::highlightText(const QString &text, const QString &pattern, const 
     return result;
 }
 
-void Theme::reload()
+void Theme::announce(const State &old)
 {
-    const State old = m_state;
-    m_state = readState();
-
-    if (!qFuzzyCompare(old.pixelRatio, m_state.pixelRatio))
+    const State &now = *m_state;
+    if (!qFuzzyCompare(old.pixelRatio, now.pixelRatio))
         Q_EMIT pixelRatioChanged();
-    if (old.scheme != m_state.scheme)
+    if (old.scheme != now.scheme)
         Q_EMIT colorSchemeChanged();
     for (int role = 0; role < ColorRoleCount; ++role) {
-        if (old.colors.at(role) != m_state.colors.at(role))
+        if (old.colors.at(role) != now.colors.at(role))
             Q_EMIT (this->*colorSignal(ColorRole(role)))();
     }
-    if (old.directory != m_state.directory)
+    if (old.directory != now.directory)
         Q_EMIT themeDirectoryChanged();
 }
 
-Theme::State Theme::readState() const
+Theme::State Theme::Configuration::readState() const
 {
     State state;
     state.pixelRatio = readPixelRatio();
@@ -142,10 +217,12 @@ Theme::State Theme::readState() const
     c[SecondaryHighlightColor] = readColor(SecondaryHighlightColor, withAlpha(c[HighlightColor], SecondaryOpacity));
     c[HighlightBackgroundColor] = readColor(HighlightBackgroundColor, c[HighlightColor]);
     c[OverlayBackgroundColor] = readColor(OverlayBackgroundColor, dark ? QColor(0xff, 0xff, 0xff) : QColor(0x00, 0x00, 0x00));
+    c[ErrorColor] = readColor(ErrorColor, dark ? QColor(0xc6, 0x28, 0x28) : QColor(0xff, 0x4d, 0x4d));
+    c[BackgroundColor] = readColor(BackgroundColor, dark ? QColor(0xf4, 0xf6, 0xfa) : QColor(0x10, 0x14, 0x1c));
     return state;
 }
 
-bool Theme::isNewRefusal(const MGConfItem *item, const QVariant &value) const
+bool Theme::Configuration::isNewRefusal(const MGConfItem *item, const QVariant &value) const
 {
     auto known = m_refused.constFind(item->key());
     if (known != m_refused.constEnd() && *known == value && known->userType() == value.userType())
@@ -154,12 +231,12 @@ bool Theme::isNewRefusal(const MGConfItem *item, const QVariant &value) const
     return true;
 }
 
-void Theme::forgetRefusal(const MGConfItem *item) const
+void Theme::Configuration::forgetRefusal(const MGConfItem *item) const
 {
     m_refused.remove(item->key());
 }
 
-qreal Theme::readPixelRatio() const
+qreal Theme::Configuration::readPixelRatio() const
 {
     const QVariant configured = m_pixelRatioConfig->value();
     if (configured.isValid()) {
@@ -175,7 +252,7 @@ qreal Theme::readPixelRatio() const
     return qMax<qreal>(1.0, qRound(Screen::instance()->widthRatio() * 4) / 4.0);
 }
 
-Theme::ColorScheme Theme::readScheme() const
+Theme::ColorScheme Theme::Configuration::readScheme() const
 {
     const QVariant configured = m_schemeConfig->value();
     if (!configured.isValid())
@@ -193,7 +270,7 @@ Theme::ColorScheme Theme::readScheme() const
     return LightOnDark;
 }
 
-QColor Theme::readColor(ColorRole role, const QColor &fallback) const
+QColor Theme::Configuration::readColor(ColorRole role, const QColor &fallback) const
 {
     const MGConfItem *item = m_colorConfig.at(role);
     const QVariant configured = item->value();
@@ -210,7 +287,7 @@ QColor Theme::readColor(ColorRole role, const QColor &fallback) const
     return fallback;
 }
 
-QString Theme::readDirectory() const
+QString Theme::Configuration::readDirectory() const
 {
     const QVariant configured = m_directoryConfig->value();
     if (!configured.isValid())

@@ -1,12 +1,9 @@
 #pragma once
 
 #include <QColor>
-#include <QHash>
 #include <QObject>
 #include <QSize>
 #include <QVector>
-
-class MGConfItem;
 
 namespace Pelkan {
 
@@ -18,15 +15,21 @@ namespace Pelkan {
 //                                screen's width over 540, in quarter steps
 //   color_scheme                 "lightondark" (default) or "darkonlight"
 //   primary_color, secondary_color, highlight_color, secondary_highlight_color,
-//   highlight_background_color, overlay_background_color
+//   highlight_background_color, overlay_background_color, error_color, background_color
 //                                any colour QColor parses ("#rrggbb", "#aarrggbb", names);
 //                                unset colours derive from the scheme and from each other
+//                                (error_color: text and lines of input that is not
+//                                accepted; background_color: an application window's)
 //   directory                    the theme folder (icons/, graphics/), an absolute path that
 //                                is not below /proc, /sys or /dev; unset: the default theme
 // Metrics are the reference design's pixel sizes multiplied by the pixel ratio, and all
 // announce their change through pixelRatioChanged(). Invalid values, and values of the
 // wrong type, are ignored with a warning and the default is used; the warning is given
 // once per value, not again whenever another key changes.
+//
+// Every Theme of the process (each QML module has its own, besides instance()) reads one
+// shared copy of the configuration: a change is read once, and all of them hold the new
+// values before any of them announces it, so they agree at every moment.
 class Theme : public QObject
 {
     Q_OBJECT
@@ -54,6 +57,8 @@ class Theme : public QObject
     Q_PROPERTY(QColor secondaryHighlightColor READ secondaryHighlightColor NOTIFY secondaryHighlightColorChanged)
     Q_PROPERTY(QColor highlightBackgroundColor READ highlightBackgroundColor NOTIFY highlightBackgroundColorChanged)
     Q_PROPERTY(QColor overlayBackgroundColor READ overlayBackgroundColor NOTIFY overlayBackgroundColorChanged)
+    Q_PROPERTY(QColor errorColor READ errorColor NOTIFY errorColorChanged)
+    Q_PROPERTY(QColor backgroundColor READ backgroundColor NOTIFY backgroundColorChanged)
     Q_PROPERTY(QString themeDirectory READ themeDirectory NOTIFY themeDirectoryChanged)
 
 public:
@@ -67,6 +72,8 @@ public:
         SecondaryHighlightColor,
         HighlightBackgroundColor,
         OverlayBackgroundColor,
+        ErrorColor,
+        BackgroundColor,
         ColorRoleCount
     };
     Q_ENUM(ColorRole)
@@ -80,7 +87,7 @@ public:
     explicit Theme(QObject *parent = nullptr);
     ~Theme() override;
 
-    qreal pixelRatio() const { return m_state.pixelRatio; }
+    qreal pixelRatio() const { return m_state->pixelRatio; }
     qreal itemSizeSmall() const { return scaled(80); }
     qreal itemSizeMedium() const { return scaled(100); }
     qreal itemSizeLarge() const { return scaled(120); }
@@ -98,16 +105,18 @@ public:
     QSize coverSizeSmall() const { return scaledSize(148, 237); }
     QSize coverSizeLarge() const { return scaledSize(234, 374); }
 
-    ColorScheme colorScheme() const { return m_state.scheme; }
-    QColor color(ColorRole role) const { return m_state.colors.at(role); }
+    ColorScheme colorScheme() const { return m_state->scheme; }
+    QColor color(ColorRole role) const { return m_state->colors.at(role); }
     QColor primaryColor() const { return color(PrimaryColor); }
     QColor secondaryColor() const { return color(SecondaryColor); }
     QColor highlightColor() const { return color(HighlightColor); }
     QColor secondaryHighlightColor() const { return color(SecondaryHighlightColor); }
     QColor highlightBackgroundColor() const { return color(HighlightBackgroundColor); }
     QColor overlayBackgroundColor() const { return color(OverlayBackgroundColor); }
+    QColor errorColor() const { return color(ErrorColor); }
+    QColor backgroundColor() const { return color(BackgroundColor); }
 
-    QString themeDirectory() const { return m_state.directory; }
+    QString themeDirectory() const { return m_state->directory; }
 
     // The colour with its alpha replaced by opacity (0..1).
     Q_INVOKABLE QColor rgba(const QColor &color, qreal opacity) const;
@@ -128,6 +137,8 @@ Q_SIGNALS:
     void secondaryHighlightColorChanged();
     void highlightBackgroundColorChanged();
     void overlayBackgroundColorChanged();
+    void errorColorChanged();
+    void backgroundColorChanged();
     void themeDirectoryChanged();
 
 private:
@@ -137,27 +148,17 @@ private:
         QVector<QColor> colors = QVector<QColor>(ColorRoleCount);
         QString directory;
     };
+    // The configuration keys and what they hold now, shared by every Theme.
+    class Configuration;
+    friend class Configuration;
 
-    // Whether a refused value of item is new, so worth a warning; forgetRefusal() when the
-    // key holds a good value again.
-    bool isNewRefusal(const MGConfItem *item, const QVariant &value) const;
-    void forgetRefusal(const MGConfItem *item) const;
-
-    qreal scaled(qreal size) const { return size * m_state.pixelRatio; }
+    qreal scaled(qreal size) const { return size * m_state->pixelRatio; }
     QSize scaledSize(int width, int height) const;
-    void reload();
-    State readState() const;
-    qreal readPixelRatio() const;
-    ColorScheme readScheme() const;
-    QColor readColor(ColorRole role, const QColor &fallback) const;
-    QString readDirectory() const;
+    // Announces what differs between old and the values now read.
+    void announce(const State &old);
 
-    QVector<MGConfItem *> m_colorConfig;
-    MGConfItem *m_pixelRatioConfig;
-    MGConfItem *m_schemeConfig;
-    MGConfItem *m_directoryConfig;
-    State m_state;
-    mutable QHash<QString, QVariant> m_refused; // key -> the value last warned about
+    const State *m_state;
+    State m_detached; // the last values, once the shared configuration went before this
 };
 
 } // namespace Pelkan

@@ -23,6 +23,7 @@ DeclarativeTextBaseItem::DeclarativeTextBaseItem(QQuickItem *parent)
         resting.setAlphaF(0.4);
         m_underline->setColor(resting);
         m_underline->setHighlightColor(m_palette->highlightColor());
+        m_underline->setErrorColor(m_palette->errorColor());
     };
     const auto lineWidths = [this] {
         const qreal ratio = Pelkan::Theme::instance()->pixelRatio();
@@ -31,9 +32,9 @@ DeclarativeTextBaseItem::DeclarativeTextBaseItem(QQuickItem *parent)
     };
     lineColors();
     lineWidths();
-    m_underline->setErrorColor(QColor(0xff, 0x4d, 0x4d));
     connect(m_palette, &Pelkan::Palette::primaryColorChanged, this, lineColors);
     connect(m_palette, &Pelkan::Palette::highlightColorChanged, this, lineColors);
+    connect(m_palette, &Pelkan::Palette::errorColorChanged, this, lineColors);
     connect(Pelkan::Theme::instance(), &Pelkan::Theme::pixelRatioChanged, this, lineWidths);
     themePaddings();
     connect(Pelkan::Theme::instance(), &Pelkan::Theme::pixelRatioChanged, this, &DeclarativeTextBaseItem::themePaddings);

@@ -90,6 +90,16 @@ void Slideable::setCurrentIndex(int index)
         moveTo(index, DeclarativeTabViewAction::Immediate);
 }
 
+void Slideable::keepRequestedIndex(int index)
+{
+    // Until the view is complete its model may not be set yet: the index is taken as asked
+    // and fitted to the model once everything declared is in.
+    if (index == m_currentIndex)
+        return;
+    m_currentIndex = index;
+    Q_EMIT currentIndexChanged();
+}
+
 QQuickItem *Slideable::currentItem() const
 {
     return m_items.value(m_currentIndex);
@@ -165,11 +175,15 @@ void Slideable::setDragging(bool dragging)
 
 void Slideable::moveTo(int index, int operationType)
 {
+    if (!m_complete) {
+        keepRequestedIndex(index);
+        return;
+    }
     const int n = count();
     if (n == 0)
         return;
     index = m_loops ? wrap(index) : qBound(0, index, n - 1);
-    if (operationType == DeclarativeTabViewAction::Immediate || !m_complete || !isVisible()) {
+    if (operationType == DeclarativeTabViewAction::Immediate || !isVisible()) {
         m_animation.stop();
         land(index);
         return;
@@ -269,8 +283,11 @@ void Slideable::componentComplete()
             Q_EMIT countChanged();
     }
     m_complete = true;
+    const int requested = m_currentIndex;
     m_currentIndex = wrap(m_currentIndex);
     m_position = m_currentIndex;
+    if (m_currentIndex != requested)
+        Q_EMIT currentIndexChanged();
     updateDragFilter();
     refresh();
     Q_EMIT aliveCountChanged();
@@ -284,6 +301,11 @@ void Slideable::geometryChanged(const QRectF &newGeometry, const QRectF &oldGeom
 
 void Slideable::modelChangedRows()
 {
+    if (!m_complete) {
+        // Nothing is made yet, and the index asked for waits for the whole declaration.
+        Q_EMIT countChanged();
+        return;
+    }
     if (!m_delegate)
         return;
     // Rows came, went or moved: what was made for them may stand for other rows now.
@@ -300,8 +322,7 @@ void Slideable::modelChangedRows()
 
 void Slideable::updateRow(int row)
 {
-    QQuickItem *item = m_items.value(row);
-    QQmlContext *context = item && m_delegate ? item->property("_slideContext").value<QQmlContext *>() : nullptr;
+    QQmlContext *context = m_contexts.value(m_items.value(row));
     if (!context)
         return;
     const QVariantHash values = m_model->values(row);
@@ -327,7 +348,7 @@ QQuickItem *Slideable::create(int index)
         return nullptr;
     }
     context->setParent(item);
-    item->setProperty("_slideContext", QVariant::fromValue(context));
+    m_contexts.insert(item, context);
     item->setParentItem(this);
     m_items.insert(index, item);
     m_delegate->completeCreate();
@@ -339,6 +360,7 @@ void Slideable::releaseItem(int index)
     QQuickItem *item = m_items.take(index);
     if (!item)
         return;
+    m_contexts.remove(item);
     item->setVisible(false);
     item->setParentItem(nullptr);
     // At once, so that no more than the cache is ever alive; later only if a finger is

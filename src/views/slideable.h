@@ -101,6 +101,7 @@ private:
     qreal along(const QPointF &point) const;
     int wrap(int index) const;
     qreal offsetOf(int index) const;
+    void keepRequestedIndex(int index);
     void setPosition(qreal position);
     void setMoving(bool moving);
     void setDragging(bool dragging);
@@ -123,6 +124,7 @@ private:
     SlideableModel *m_model;
     QPointer<QQmlComponent> m_delegate;
     QHash<int, QQuickItem *> m_items;      // alive items by index
+    QHash<QQuickItem *, QQmlContext *> m_contexts; // the context each delegate item was made in
     QList<QQuickItem *> m_children;        // items declared as children, when no delegate
     QVariantAnimation m_animation;
     QPointF m_pressPosition;

@@ -78,18 +78,26 @@ void DeclarativeWindow::_setCover(QObject *window)
             cover->setProperty("mainWindow", QVariant::fromValue<QObject *>(this));
     }
 
-    WindowPropertyPublisher::setRetainCover(publicationTarget(), cover != nullptr);
-    publishWindowProperties();
-    Q_EMIT switcherWindowChanged(qobject_cast<QQuickWindow *>(cover));
-    _updateCoverVisibility();
+    coverWindowChanged();
 }
 
 void DeclarativeWindow::coverWindowDestroyed()
 {
     m_coverWindow = nullptr;
-    WindowPropertyPublisher::setRetainCover(publicationTarget(), false);
+    coverWindowChanged();
+}
+
+void DeclarativeWindow::coverWindowChanged()
+{
+    // The home screen learns with the window whether there is a cover to show.
+    const bool haveCover = m_coverWindow != nullptr;
+    const bool hintChanged = haveCover != m_haveCoverHint;
+    m_haveCoverHint = haveCover;
+    WindowPropertyPublisher::setRetainCover(publicationTarget(), haveCover);
     publishWindowProperties();
-    Q_EMIT switcherWindowChanged(nullptr);
+    if (hintChanged)
+        Q_EMIT haveCoverChanged();
+    Q_EMIT switcherWindowChanged(qobject_cast<QQuickWindow *>(m_coverWindow.data()));
     _updateCoverVisibility();
 }
 

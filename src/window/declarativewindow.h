@@ -27,13 +27,17 @@ class WindowEventObserver;
 //   with application windows that publish it.
 // - _setCover(window) attaches a cover window: its properties and this window's are
 //   republished and the compositor is asked to retain the cover; the cover is detached
-//   again when it is destroyed or when _setCover(null) is called.
+//   again when it is destroyed or when _setCover(null) is called. _haveCoverHint follows:
+//   true while a cover window is attached, false once it is gone (it can still be
+//   written in between).
 // - _coverVisible is true while a cover is attached and the application window is not
 //   visible in the foreground (or the cover is the primary window); reset recomputes it.
 // - _queueDeletion(object) deletes the object once the next frame has been rendered, so
 //   that the scene graph never sees a deleted item; _processPendingDeletions() does it
 //   at once, and happens also when the GL context goes away and before the app quits.
 // - deactivate() minimises the window, which sends the application to the background.
+// - deviceOrientation follows shownOrientation() of the window's screen: on a desktop the
+//   content is upright in the screen's shape, and the orientation says so.
 class DeclarativeWindow : public Pelkan::Control
 {
     Q_OBJECT
@@ -116,6 +120,12 @@ public:
 
     Q_INVOKABLE void _queueDeletion(QObject *object);
 
+    // Whether the system turns the display for applications (a desktop), unlike the
+    // device's compositor, which leaves the display as it is built and turning to them.
+    static bool turnsDisplayItself();
+    // The orientation the user sees the screen in: on the device how it is held; on a
+    // desktop the screen's shape (in the orientation the screen reports where that fits).
+    static Qt::ScreenOrientation shownOrientation(const QScreen *screen);
     static Qt::ScreenOrientation toScreenOrientation(int orientation);
     static Orientation fromScreenOrientation(Qt::ScreenOrientation orientation, const QScreen *screen);
 
@@ -170,6 +180,7 @@ private:
     void trackScreen(QScreen *screen);
     void reportContentOrientation();
     void publishWindowProperties();
+    void coverWindowChanged();
     void dispatch(QEvent *event);
 
     Orientation m_orientation = DeclarativeOrientation::None;

@@ -25,7 +25,7 @@ void DeclarativeWindow::followPrimaryScreen()
 {
     if (QScreen *screen = QGuiApplication::primaryScreen()) {
         screen->setOrientationUpdateMask(AllScreenOrientations);
-        m_deviceOrientation = fromScreenOrientation(screen->orientation(), screen);
+        m_deviceOrientation = fromScreenOrientation(shownOrientation(screen), screen);
         setSize(screen->size());
         connect(screen, &QScreen::geometryChanged, this, &DeclarativeWindow::screenGeometryChanged);
     } else {
@@ -124,6 +124,26 @@ Qt::ScreenOrientation DeclarativeWindow::toScreenOrientation(int orientation)
     }
 }
 
+bool DeclarativeWindow::turnsDisplayItself()
+{
+    return QGuiApplication::platformName() != QLatin1String("wayland");
+}
+
+Qt::ScreenOrientation DeclarativeWindow::shownOrientation(const QScreen *screen)
+{
+    const Qt::ScreenOrientation reported = screen->orientation();
+    if (!turnsDisplayItself())
+        return reported; // the device: how it is held
+    // A desktop system turns the display itself, so content is upright in the screen's
+    // shape. Some platforms report a screen they have not turned as landscape whatever its
+    // shape (an X server without rotation): the shape wins where the two disagree.
+    const auto portrait = [](Qt::ScreenOrientation o) {
+        return o == Qt::PortraitOrientation || o == Qt::InvertedPortraitOrientation;
+    };
+    const Qt::ScreenOrientation shape = screen->primaryOrientation();
+    return portrait(reported) == portrait(shape) ? reported : shape;
+}
+
 DeclarativeWindow::Orientation DeclarativeWindow::fromScreenOrientation(Qt::ScreenOrientation orientation,
                                                                         const QScreen *screen)
 {
@@ -143,6 +163,8 @@ DeclarativeWindow::Orientation DeclarativeWindow::fromScreenOrientation(Qt::Scre
 
 void DeclarativeWindow::setScreenOrientation(Qt::ScreenOrientation orientation)
 {
+    if (m_screen)
+        orientation = shownOrientation(m_screen);
     m_deviceOrientation = fromScreenOrientation(orientation, m_screen);
     Q_EMIT deviceOrientationChanged();
     if (!m_orientationLocked)
@@ -228,13 +250,18 @@ int DeclarativeWindow::configuredScreenRotation()
 
 void DeclarativeWindow::trackScreen(QScreen *screen)
 {
-    if (m_screen)
+    if (m_screen) {
         disconnect(m_screen, &QScreen::orientationChanged, this, &DeclarativeWindow::setScreenOrientation);
+        disconnect(m_screen, &QScreen::primaryOrientationChanged, this, &DeclarativeWindow::setScreenOrientation);
+    }
     m_screen = screen;
     if (!screen)
         return;
     screen->setOrientationUpdateMask(AllScreenOrientations);
     connect(screen, &QScreen::orientationChanged, this, &DeclarativeWindow::setScreenOrientation);
+    // A desktop screen that changes shape turns what the user sees.
+    if (turnsDisplayItself())
+        connect(screen, &QScreen::primaryOrientationChanged, this, &DeclarativeWindow::setScreenOrientation);
     setScreenOrientation(screen->orientation());
     reportContentOrientation();
 }

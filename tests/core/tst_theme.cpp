@@ -107,7 +107,9 @@ void tst_Theme::refusedValues()
     QFETCH(QByteArray, name);
     QFETCH(QString, value);
     QFETCH(QString, warning);
+    MGConfItem item(key(name.constData()));
     QVERIFY(ConfigFixture::reset(key(name.constData())));
+    QTRY_VERIFY(!item.value().isValid()); // the themes have heard of it too
     Theme theme; // with the key's default
     const qreal ratio = theme.pixelRatio();
     const QString directory = theme.themeDirectory();
@@ -182,6 +184,9 @@ void tst_Theme::colourSchemeChangesDefaults()
     QSignalSpy scheme(&theme, &Theme::colorSchemeChanged);
     QSignalSpy primary(&theme, &Theme::primaryColorChanged);
     QSignalSpy overlay(&theme, &Theme::overlayBackgroundColorChanged);
+    QSignalSpy error(&theme, &Theme::errorColorChanged);
+    QSignalSpy background(&theme, &Theme::backgroundColorChanged);
+    const QColor lightBackground = theme.backgroundColor();
 
     QVERIFY(ConfigFixture::write(key("color_scheme"), QStringLiteral("'darkonlight'")));
     QTRY_COMPARE(scheme.count(), 1);
@@ -190,6 +195,10 @@ void tst_Theme::colourSchemeChangesDefaults()
     QCOMPARE(theme.overlayBackgroundColor(), QColor(Qt::white));
     QCOMPARE(primary.count(), 1);
     QCOMPARE(overlay.count(), 1);
+    // A window of each scheme has its own background and error colour: light under dark text.
+    QCOMPARE(error.count(), 1);
+    QCOMPARE(background.count(), 1);
+    QVERIFY(theme.backgroundColor().lightness() > 200 && lightBackground.lightness() < 50);
 }
 
 void tst_Theme::themeDirectory()

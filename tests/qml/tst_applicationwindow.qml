@@ -23,6 +23,17 @@ Item {
     }
 
     Component {
+        id: windowComponent
+        ApplicationWindow { anchors.fill: parent; initialPage: pageComponent }
+    }
+
+    Component {
+        id: coverComponent
+        Cover {}
+    }
+    Cover { id: coverItem }
+
+    Component {
         id: remorsePage
         Page {
             property alias popup: popup
@@ -35,27 +46,55 @@ Item {
         name: "ApplicationWindow"
         when: windowShown
 
+        // The chosen orientation, within what the window and its page allow; with the device
+        // left alone it is the screen's shape on this desktop, where the page is upright.
         function test_orientation_data() {
+            var shape = Screen.height > Screen.width ? Orientation.Portrait : Orientation.Landscape
+            var other = shape === Orientation.Portrait ? Orientation.Landscape : Orientation.Portrait
             return [
                 { tag: "page allows portrait only", page: Orientation.Portrait, device: Orientation.Landscape, expected: Orientation.Portrait },
                 { tag: "page allows all", page: Orientation.All, device: Orientation.Landscape, expected: Orientation.Landscape },
                 { tag: "page allows landscape only", page: Orientation.Landscape, device: Orientation.Portrait, expected: Orientation.Landscape },
                 { tag: "page allows only what the window does not", page: Orientation.PortraitInverted,
                   device: Orientation.Landscape, expected: Orientation.Landscape },
+                { tag: "device as it shows: the screen's shape", page: Orientation.All, expected: shape },
+                { tag: "device as it shows, only the other shape allowed", page: other, expected: other },
             ]
         }
 
         function test_orientation(data) {
-            app.pageStack.clear()
-            var page = app.pageStack.push(pageComponent, { "allowedOrientations": data.page }, PageStackAction.Immediate)
-            app.deviceOrientation = data.device
-            compare(app.orientation, data.expected)
-            compare(page.orientation, data.expected)
-            // Turned against the display, the content swaps its sides.
-            var turned = Screen.angleBetween(Screen.orientation, data.expected) % 180 !== 0
-            compare(app.contentItem.width, turned ? app.height : app.width)
-            compare(page.width, app.contentItem.width)
-            tryCompare(app.contentItem, "rotation", Screen.angleBetween(Screen.orientation, data.expected))
+            var made = windowComponent.createObject(root, { "allowedOrientations": Orientation.Portrait | Orientation.Landscape })
+            var page = made.pageStack.push(pageComponent, { "allowedOrientations": data.page }, PageStackAction.Immediate)
+            if (data.device)
+                made.deviceOrientation = data.device
+            compare(made.orientation, data.expected)
+            compare(page.isPortrait, data.expected === Orientation.Portrait)
+            // Turned against the display (which shows the screen's shape upright here), the
+            // content swaps its sides.
+            var turned = Screen.angleBetween(Screen.primaryOrientation, data.expected) % 180 !== 0
+            compare(made.contentItem.width, turned ? made.height : made.width)
+            compare(page.width, made.contentItem.width)
+            tryCompare(made.contentItem, "rotation", Screen.angleBetween(Screen.primaryOrientation, data.expected))
+            made.destroy()
+        }
+
+        // The home screen is told there is a cover whenever one is given, and not once it goes.
+        function test_coverHint_data() {
+            return [
+                { tag: "a component", cover: coverComponent },
+                { tag: "a cover item", cover: coverItem },
+            ]
+        }
+
+        function test_coverHint(data) {
+            var made = windowComponent.createObject(root, { "cover": data.cover })
+            verify(made._haveCoverHint)
+            made.cover = null
+            verify(!made._haveCoverHint)
+            made.cover = data.cover
+            verify(made._haveCoverHint)
+            made.destroy()
+            wait(0)
         }
 
         // A popup counting down shows in the overlay over a frosted capture of the pages,

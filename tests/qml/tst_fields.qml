@@ -32,6 +32,31 @@ Item {
         }
     }
 
+    // Search fields with the default key on two kinds of page; one that opts out.
+    component NotesPage: Page { property alias field: field; SearchField { id: field } }
+    component MailPage: Page { property alias field: field; SearchField { id: field } }
+    component SilentPage: Page { property alias field: field; SearchField { id: field; autoFillKey: "" } }
+    Component { id: notesPage; NotesPage {} }
+    Component { id: mailPage; MailPage {} }
+    Component { id: silentPage; SilentPage {} }
+
+    // A search over a list: the field in the header, the model replaced as the user types.
+    readonly property var cities: ["Oslo", "Osaka", "Ostrava", "Paris", "Porto"]
+    Component {
+        id: searchList
+        ListView {
+            id: list
+            width: 480
+            height: 400
+            model: root.cities
+            header: SearchField {
+                width: list.width
+                onTextChanged: list.model = root.cities.filter(function(city) { return city.toLowerCase().indexOf(text.toLowerCase()) >= 0 })
+            }
+            delegate: Text { text: modelData; height: 40 }
+        }
+    }
+
     TestCase {
         name: "Fields"
         when: windowShown
@@ -72,12 +97,12 @@ Item {
                 keyClick("w")
             wait(500)
             tryVerify(function() {
-                var x = plain._editor.mapToItem(plain, plain._editor.cursorRectangle.x, 0).x
+                var x = plain.editor.mapToItem(plain, plain.editor.cursorRectangle.x, 0).x
                 return x > plain.leftPadding && x < plain.width - plain.rightPadding
             })
-            verify(plain._editor.width > plain.width)
+            verify(plain.editor.width > plain.width)
             keyClick(Qt.Key_Home)
-            tryVerify(function() { return plain._editor.mapToItem(plain, 0, 0).x === plain.leftPadding })
+            tryVerify(function() { return plain.editor.mapToItem(plain, 0, 0).x === plain.leftPadding })
         }
 
         function test_validation() {
@@ -96,10 +121,10 @@ Item {
 
         function test_suggestions() {
             search.text = ""
-            search._autoFill.remove("hi") // what the typing test may have left
-            search._autoFill.insert("harbour")
-            search._autoFill.insert("hamburg")
-            search._autoFill.insert("oslo")
+            search.forget("hi") // what the typing test may have left
+            search.remember("harbour")
+            search.remember("hamburg")
+            search.remember("oslo")
             mouseClick(search, search.width / 2, search.topPadding + 4)
             keyClick("h")
             tryCompare(search, "suggestions", ["hamburg", "harbour"])
@@ -109,6 +134,59 @@ Item {
             // The one suggestion left is the first row under the field's line.
             mouseClick(search, search.width / 2, search.labelItem.y + Theme.itemSizeSmall * 0.75 / 2)
             compare(search.text, "harbour")
+        }
+
+        // Typing into a search field in a list's header refills the list: the field keeps
+        // the focus through every key, also on the gallery's page that shows the pattern.
+        function test_searchInListHeader_data() {
+            return [
+                { tag: "model replaced", component: searchList },
+                { tag: "gallery: rows refilled", component: Qt.createComponent("../../examples/gallery/qml/SearchPage.qml") },
+            ]
+        }
+
+        function test_searchInListHeader(data) {
+            var made = data.component.createObject(root)
+            var list = made.list || made
+            var field = list.headerItem instanceof TextField ? list.headerItem : list.headerItem.children[1]
+            mouseClick(field, field.width / 2, field.topPadding + 4)
+            verify(field.focused)
+            var typed = "os"
+            for (var i = 0; i < typed.length; ++i) {
+                keyClick(typed.charAt(i))
+                tryVerify(function() { return list.count > 0 && list.currentItem !== null })
+                verify(field.focused, "after " + typed.substring(0, i + 1))
+            }
+            compare(field.text, "os")
+            made.destroy()
+        }
+
+        // By default a search field remembers per application and page kind; an empty key
+        // remembers nothing.
+        function test_searchesRemembered_data() {
+            return [
+                { tag: "the same kind of page", first: notesPage, second: notesPage, offered: ["quorvane"] },
+                { tag: "another kind of page", first: notesPage, second: mailPage, offered: [] },
+                { tag: "opted out", first: silentPage, second: silentPage, offered: [] },
+            ]
+        }
+
+        function test_searchesRemembered(data) {
+            var first = data.first.createObject(root)
+            var field = first.field
+            mouseClick(field, field.width / 2, field.topPadding + 4)
+            keyClick("q"); keyClick("u"); keyClick("o"); keyClick("r"); keyClick("v"); keyClick("a"); keyClick("n"); keyClick("e")
+            keyClick(Qt.Key_Return)
+            var second = data.second.createObject(root) // over the first
+            mouseClick(second.field, field.width / 2, field.topPadding + 4)
+            keyClick("q")
+            if (data.offered.length > 0)
+                tryCompare(second.field, "suggestions", data.offered)
+            wait(300) // past the typing delay: nothing else comes
+            compare(second.field.suggestions, data.offered)
+            first.field.forget("quorvane")
+            first.destroy()
+            second.destroy()
         }
 
         function test_keptAboveKeyboard_data() {
@@ -123,12 +201,12 @@ Item {
             field.forceEditorFocus()
             tryVerify(function() { return field.focused })
             wait(0)
-            var bottom = field._editor.mapToItem(page, 0, field._editor.height).y
+            var bottom = field.editor.mapToItem(page, 0, field.editor.height).y
             verify(bottom <= root.keyboard.y + 0.5, "bottom at " + bottom)
             compare(page.contentY > 0, data.scrolls)
             // The keyboard rises further: the field follows it.
             root.keyboard = Qt.rect(0, 300, 480, 500)
-            tryVerify(function() { return field._editor.mapToItem(page, 0, field._editor.height).y <= 300.5 })
+            tryVerify(function() { return field.editor.mapToItem(page, 0, field.editor.height).y <= 300.5 })
         }
     }
 }

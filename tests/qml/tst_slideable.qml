@@ -212,7 +212,36 @@ Item {
             data.view.moveTo(0, TabViewAction.Immediate)
         }
 
-        // Rows that come and go make the items again for the rows now there.
+        // The index asked for holds however the declaration orders it against the model.
+        function test_declarationOrder_data() {
+            var rows = []
+            var types = ["Private.SlideableBase", "SlideshowView", "TabView"]
+            var orders = [
+                { name: "model first", text: "model: 5; currentIndex: 2\ndelegate: Item {}" },
+                { name: "index first", text: "currentIndex: 2; model: 5\ndelegate: Item {}" },
+                { name: "delegate first", text: "delegate: Item {}\nmodel: 5; currentIndex: 2" },
+                { name: "list, index first", text: "currentIndex: 2; model: ['a', 'b', 'c', 'd', 'e']\ndelegate: Item {}" },
+                { name: "list, model first", text: "model: ['a', 'b', 'c', 'd', 'e']; currentIndex: 2\ndelegate: Item {}" },
+            ]
+            for (var t = 0; t < types.length; ++t) {
+                for (var o = 0; o < orders.length; ++o)
+                    rows.push({ tag: types[t] + ", " + orders[o].name, type: types[t], properties: orders[o].text })
+            }
+            return rows
+        }
+
+        function test_declarationOrder(data) {
+            var view = Qt.createQmlObject("import QtQuick 2.6; import Quorvane.Pelkan 1.0; "
+                                          + "import Quorvane.Pelkan.private 1.0 as Private; "
+                                          + data.type + " { width: 100; height: 100; " + data.properties + " }", root)
+            compare(view.currentIndex, 2)
+            verify(view.currentItem !== null)
+            compare(view.currentItem.Private.Slide.index, 2)
+            view.destroy()
+        }
+
+        // Rows that come and go make the items again for the rows now there; a row that
+        // changes updates its item.
         function test_modelEdits() {
             fromModel.moveTo(2, TabViewAction.Immediate)
             strings.remove(2)
@@ -221,6 +250,11 @@ Item {
             compare(fromModel.currentItem.text, "b")
             strings.insert(0, "z")
             compare(fromModel.itemAt(0).text, "z")
+            // A changed row reaches the item made for it, which stays.
+            var item = fromModel.itemAt(0)
+            strings.set(0, "y")
+            compare(fromModel.itemAt(0), item)
+            compare(item.text, "y")
             strings.strings = ["a", "b", "c"]
         }
 

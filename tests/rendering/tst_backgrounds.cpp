@@ -198,6 +198,8 @@ void tst_Backgrounds::themeColours_data()
                                               << "overlay_background_color" << qRgb(128, 255, 128);
     QTest::newRow("dimmed region: overlay colour at 0.7") << QByteArray("DimmedRegion { width: 100; height: 100 }")
                                                           << "overlay_background_color" << qRgb(77, 255, 77);
+    QTest::newRow("underline: error colour") << QByteArray("Underline { width: 100; height: 100; lineWidth: 100; errorHighlight: true }")
+                                             << "error_color" << qRgb(0, 255, 0);
 }
 
 void tst_Backgrounds::themeColours()

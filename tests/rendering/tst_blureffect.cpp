@@ -31,6 +31,8 @@ private Q_SLOTS:
     void asTextureProvider();
     void layerGivenBack_data();
     void layerGivenBack();
+    void sameAfterAnother_data();
+    void sameAfterAnother();
 };
 
 void tst_BlurEffect::weights_data()
@@ -257,6 +259,55 @@ void tst_BlurEffect::layerGivenBack()
         QVERIFY(layerOn(other));
     }
     QCOMPARE(layerOn(source), layerWasOn);
+}
+
+void tst_BlurEffect::sameAfterAnother_data()
+{
+    QTest::addColumn<float>("intensity");
+    QTest::newRow("blurred") << 1.0f;
+    QTest::newRow("half mixed") << 0.5f;
+}
+
+// An effect made as another on the same source goes (destroy() from QML: deleted a moment
+// later) draws what the first did, in both render loops.
+void tst_BlurEffect::sameAfterAnother()
+{
+    QFETCH(float, intensity);
+    QQuickView view;
+    QQuickItem *root = showScene(view, "import QtQuick 2.6\n"
+                                   "Rectangle { width: 200; height: 100; color: 'blue'\n"
+                                   "  Rectangle { objectName: 'source'; width: 100; height: 100; color: 'black'\n"
+                                   "    Rectangle { width: 50; height: 100; color: 'red' } }\n"
+                                   "}\n");
+    QVERIFY(root);
+    auto source = root->findChild<QQuickItem *>(QStringLiteral("source"));
+    auto make = [&] {
+        auto blur = new BlurEffect(root);
+        blur->setPosition(QPointF(100, 0));
+        blur->setSize(QSizeF(100, 100));
+        blur->setIntensity(intensity);
+        blur->setSourceItem(source);
+        return blur;
+    };
+    // The reds along the middle row of the effect, once it draws at all.
+    auto row = [&](QVector<int> *reds) {
+        QImage grab;
+        QTRY_VERIFY_WITH_TIMEOUT((grab = view.grabWindow(), qBlue(grab.pixel(190, 50)) < 100), 5000);
+        for (int x = 100; x < 200; ++x)
+            reds->append(qRed(grab.pixel(x, 50)));
+    };
+    QPointer<BlurEffect> first = make();
+    QVector<int> before, after;
+    row(&before);
+    first->deleteLater();
+    QScopedPointer<BlurEffect> second(make());
+    QTRY_VERIFY(!first);
+    row(&after);
+    QVERIFY(!QTest::currentTestFailed());
+    // The first is blurred: a soft edge, shades between red and black.
+    QVERIFY(std::count_if(before.begin(), before.end(), [](int red) { return red > 20 && red < 235; }) >= 4);
+    for (int x = 0; x < before.size(); ++x)
+        QVERIFY2(qAbs(before.at(x) - after.at(x)) <= 8, qPrintable(QStringLiteral("at %1: %2 first, %3 second").arg(x).arg(before.at(x)).arg(after.at(x))));
 }
 
 QTEST_MAIN(tst_BlurEffect)

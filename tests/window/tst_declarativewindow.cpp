@@ -393,6 +393,9 @@ void tst_DeclarativeWindow::coverAttachAndDestroy()
     QCOMPARE(m_published.first().value, QVariant(true));
     QCOMPARE(m_published.at(3).name, QStringLiteral("QUORVANE_COVER_WINDOW"));
     QCOMPARE(m_published.at(3).value.toULongLong(), qulonglong(cover->winId()));
+    // The home screen is told there is a cover with the same publication.
+    QCOMPARE(m_published.at(4).name, QStringLiteral("QUORVANE_HAVE_COVER"));
+    QCOMPARE(m_published.at(4).value, QVariant(true));
     QCOMPARE(switcher.count(), 1);
     QCOMPARE(switcher.last().first().value<QQuickWindow *>(), cover);
 
@@ -409,6 +412,8 @@ void tst_DeclarativeWindow::coverAttachAndDestroy()
     QVERIFY(!window->coverWindow());
     QCOMPARE(m_published.first().name, QStringLiteral("QUORVANE_RETAIN_COVER"));
     QCOMPARE(m_published.first().value, QVariant(false));
+    QCOMPARE(m_published.at(4).value, QVariant(false));
+    QVERIFY(!window->haveCoverHint());
     QVERIFY(!window->coverVisible());
     QCOMPARE(switcher.count(), 2);
 }

@@ -52,9 +52,9 @@ Page {
                 EnterKey.onClicked: page.summary = "Going to " + text
                 Component.onCompleted: {
                     if (suggestions.length === 0) {
-                        _autoFill.insert("Helsinki harbour")
-                        _autoFill.insert("Hamburg")
-                        _autoFill.insert("Harwich")
+                        remember("Helsinki harbour")
+                        remember("Hamburg")
+                        remember("Harwich")
                     }
                 }
             }

@@ -12,6 +12,7 @@ Page {
         { name: "gestures", title: "Gestures" }, { name: "cover", title: "Cover" },
         { name: "form", title: "Forms and controls" },
         { name: "photos", title: "Photo slideshow" }, { name: "tabs", title: "Tabs" }, { name: "lists", title: "Lists and menus" },
+        { name: "search", title: "Searching a list" },
         { name: "backgrounds", title: "Backgrounds" }
     ]
 
@@ -57,6 +58,8 @@ Page {
                             page.pageStack.push(Qt.resolvedUrl("TabsPage.qml"))
                         else if (modelData.name === "backgrounds")
                             page.pageStack.push(Qt.resolvedUrl("BackgroundsPage.qml"))
+                        else if (modelData.name === "search")
+                            page.pageStack.push(Qt.resolvedUrl("SearchPage.qml"))
                         else
                             page.pageStack.push(Qt.resolvedUrl("SubjectPage.qml"),
                                                 { "name": modelData.name, "title": modelData.title,

@@ -8,7 +8,7 @@ ApplicationWindow {
     id: app
 
     // Which subject the gallery opens on, over the home page: theme, images, orientation,
-    // format, gestures, cover, form, dialog, lists, photos, tabs; "home" for none.
+    // format, gestures, cover, form, dialog, lists, search, photos, tabs; "home" for none.
     property string startPage: "home"
     // Pictures on disk for the slideshow (set by the program).
     property var photos: []
@@ -28,10 +28,10 @@ ApplicationWindow {
     Component.onCompleted: {
         if (startPage === "dialog")
             pageStack.currentPage.openDialog(PageStackAction.Immediate)
-        else if (["lists", "form", "photos", "tabs", "backgrounds"].indexOf(startPage) >= 0)
+        else if (["lists", "form", "photos", "tabs", "backgrounds", "search"].indexOf(startPage) >= 0)
             pageStack.push(Qt.resolvedUrl({ "lists": "ListsPage.qml", "form": "FormPage.qml",
                                             "photos": "PhotosPage.qml", "tabs": "TabsPage.qml",
-                                            "backgrounds": "BackgroundsPage.qml" }[startPage]),
+                                            "backgrounds": "BackgroundsPage.qml", "search": "SearchPage.qml" }[startPage]),
                            startPage === "photos" ? { "photos": photos } : {}, PageStackAction.Immediate)
         else if (startPage !== "home")
             pageStack.push(Qt.resolvedUrl("SubjectPage.qml"), { "name": startPage, "application": app },

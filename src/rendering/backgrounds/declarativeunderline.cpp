@@ -1,4 +1,5 @@
 #include "declarativeunderline.h"
+#include "core/theme.h"
 
 #include <QQuickWindow>
 #include <QSGRectangleNode>
@@ -7,6 +8,10 @@
 
 DeclarativeUnderline::DeclarativeUnderline(QQuickItem *parent)
     : QQuickItem(parent)
+    , m_errorColor(this, [] { return Pelkan::Theme::instance()->errorColor(); }, [this] {
+        Q_EMIT errorColorChanged();
+        update();
+    })
 {
     setFlag(ItemHasContents);
 }
@@ -27,7 +32,8 @@ void assign(DeclarativeUnderline *item, T &member, const T &value, Signal change
 
 void DeclarativeUnderline::setColor(const QColor &color) { assign(this, m_color, color, &DeclarativeUnderline::colorChanged); }
 void DeclarativeUnderline::setHighlightColor(const QColor &color) { assign(this, m_highlightColor, color, &DeclarativeUnderline::highlightColorChanged); }
-void DeclarativeUnderline::setErrorColor(const QColor &color) { assign(this, m_errorColor, color, &DeclarativeUnderline::errorColorChanged); }
+void DeclarativeUnderline::setErrorColor(const QColor &color) { m_errorColor.set(color); }
+void DeclarativeUnderline::resetErrorColor() { m_errorColor.reset(); }
 void DeclarativeUnderline::setHighlighted(bool highlighted) { assign(this, m_highlighted, highlighted, &DeclarativeUnderline::highlightedChanged); }
 void DeclarativeUnderline::setErrorHighlight(bool error) { assign(this, m_errorHighlight, error, &DeclarativeUnderline::errorHighlightChanged); }
 void DeclarativeUnderline::setLineWidth(qreal width) { assign(this, m_lineWidth, qMax<qreal>(0, width), &DeclarativeUnderline::lineWidthChanged); }
@@ -57,7 +63,7 @@ QSGNode *DeclarativeUnderline::updatePaintNode(QSGNode *oldNode, UpdatePaintNode
     if (!node)
         node = window()->createRectangleNode();
     node->setRect(lineRect(window()->effectiveDevicePixelRatio(), mapToScene(QPointF(0, 0))));
-    node->setColor(m_errorHighlight ? m_errorColor : m_highlighted ? m_highlightColor : m_color);
+    node->setColor(m_errorHighlight ? m_errorColor.value() : m_highlighted ? m_highlightColor : m_color);
     return node;
 }
 

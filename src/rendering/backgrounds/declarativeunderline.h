@@ -1,5 +1,7 @@
 #pragma once
 
+#include "rendering/common/themedcolor.h"
+
 #include <QColor>
 #include <QQuickItem>
 
@@ -7,13 +9,14 @@
 // to whole device pixels so it stays crisp at any position and pixel ratio: `lineWidth`
 // thick in `color`, or `focusLineWidth` thick in `highlightColor` while `highlighted`
 // (a focused field), or in `errorColor` while `errorHighlight` (input that does not
-// validate; it wins over the focus colour).
+// validate; it wins over the focus colour). The error colour is the theme's until set,
+// and again after a reset.
 class DeclarativeUnderline : public QQuickItem
 {
     Q_OBJECT
     Q_PROPERTY(QColor color READ color WRITE setColor NOTIFY colorChanged)
     Q_PROPERTY(QColor highlightColor READ highlightColor WRITE setHighlightColor NOTIFY highlightColorChanged)
-    Q_PROPERTY(QColor errorColor READ errorColor WRITE setErrorColor NOTIFY errorColorChanged)
+    Q_PROPERTY(QColor errorColor READ errorColor WRITE setErrorColor RESET resetErrorColor NOTIFY errorColorChanged)
     Q_PROPERTY(bool highlighted READ highlighted WRITE setHighlighted NOTIFY highlightedChanged)
     Q_PROPERTY(bool errorHighlight READ errorHighlight WRITE setErrorHighlight NOTIFY errorHighlightChanged)
     Q_PROPERTY(qreal lineWidth READ lineWidth WRITE setLineWidth NOTIFY lineWidthChanged)
@@ -26,8 +29,9 @@ public:
     void setColor(const QColor &color);
     QColor highlightColor() const { return m_highlightColor; }
     void setHighlightColor(const QColor &color);
-    QColor errorColor() const { return m_errorColor; }
+    QColor errorColor() const { return m_errorColor.value(); }
     void setErrorColor(const QColor &color);
+    void resetErrorColor();
     bool highlighted() const { return m_highlighted; }
     void setHighlighted(bool highlighted);
     bool errorHighlight() const { return m_errorHighlight; }
@@ -57,7 +61,7 @@ protected:
 private:
     QColor m_color { Qt::gray };
     QColor m_highlightColor { Qt::white };
-    QColor m_errorColor { Qt::red };
+    ThemedColor m_errorColor;
     qreal m_lineWidth = 1;
     qreal m_focusLineWidth = 2;
     bool m_highlighted = false;

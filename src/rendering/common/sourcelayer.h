@@ -4,7 +4,9 @@
 #include <QQuickItem>
 
 // Switches on the layer of an item that an effect reads but that is no texture provider of
-// its own, and switches it off again when the effect lets go, unless it was on already.
+// its own, and switches it off again when the last effect that switched it on lets go;
+// a layer that was on already (the application's) is left alone. Effects on the same item
+// share the layer: one letting go does not take it from the others. GUI thread only.
 class SourceLayer
 {
 public:
@@ -14,5 +16,5 @@ public:
     void release();
 
 private:
-    QPointer<QQuickItem> m_item; // the item whose layer this switched on
+    QPointer<QQuickItem> m_item; // the item whose layer this holds
 };

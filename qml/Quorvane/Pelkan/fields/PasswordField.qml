@@ -6,7 +6,9 @@ import Quorvane.Pelkan 1.0
 TextField {
     id: field
 
+    /*! Whether the button that shows the text is there. */
     property bool showEchoModeToggle: true
+    /*! Whether the text shows as it is instead of as dots. */
     property bool passwordVisible: false
 
     label: qsTrId("quorvanepelkan-la-password")
@@ -17,11 +19,15 @@ TextField {
     IconButton {
         visible: field.showEchoModeToggle
         x: field.width - field.rightPadding + Theme.paddingSmall
-        y: field.topPadding + (field._editor.height - height) / 2
+        y: field.topPadding + (field.editor.height - height) / 2
         width: Theme.iconSizeMedium
         height: Theme.iconSizeMedium
         iconSource: "image://theme/icon-m-visible"
         down: field.passwordVisible
+        Accessible.role: Accessible.CheckBox
+        Accessible.checkable: true
+        Accessible.checked: field.passwordVisible
+        Accessible.name: qsTrId("quorvanepelkan-la-show-password")
         onClicked: field.passwordVisible = !field.passwordVisible
     }
 }

@@ -8,19 +8,30 @@ import Quorvane.Pelkan.private 1.0 as Private
 Private.TextBaseItem {
     id: field
 
+    /*! The text in the field. */
     property alias text: edit.text
+    /*! A line under the field saying what it is for (or what is wrong with it). */
     property string label
+    /*! Shown in the field while it is empty. */
     property string placeholderText
+    /*! Whether the text can be selected and copied but not changed. */
     property alias readOnly: edit.readOnly
+    /*! How lines break: TextEdit.Wrap (the default), WordWrap, NoWrap, ... */
     property alias wrapMode: edit.wrapMode
+    /*! Hints to the keyboard (Qt.ImhNoPredictiveText, ...). */
     property alias inputMethodHints: edit.inputMethodHints
+    /*! Where the cursor is, in characters. */
     property alias cursorPosition: edit.cursorPosition
+    /*! How the lines are aligned. */
     property alias horizontalAlignment: edit.horizontalAlignment
+    /*! The font of the text. */
     property alias font: edit.font
+    /*! The colour of the text; the palette's unless set. */
     property alias color: edit.color
+    /*! TextEdit.PlainText, RichText, AutoText or MarkdownText. */
     property alias textFormat: edit.textFormat
-    readonly property alias _editor: edit
 
+    /*! Selects the whole text. */
     function selectAll() { edit.selectAll() }
 
     width: parent ? parent.width : implicitWidth
@@ -40,6 +51,7 @@ Private.TextBaseItem {
         selectionColor: Theme.rgba(field.palette.highlightColor, 0.4)
         selectedTextColor: field.palette.highlightColor
         font.pixelSize: Theme.fontSizeMedium
+        Accessible.name: field.label !== "" ? field.label : field.placeholderText
     }
 
     Text {
@@ -55,7 +67,8 @@ Private.TextBaseItem {
         id: labelText
         visible: field.label !== ""
         text: field.label
-        color: field.errorHighlight ? "#ff4d4d" : field.focused ? field.palette.secondaryHighlightColor : field.palette.secondaryColor
+        color: field.errorHighlight ? field.palette.errorColor
+                                    : field.focused ? field.palette.secondaryHighlightColor : field.palette.secondaryColor
         font.pixelSize: Theme.fontSizeSmall
         elide: Text.ElideRight
     }

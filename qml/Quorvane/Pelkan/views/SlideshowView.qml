@@ -8,6 +8,7 @@ import Quorvane.Pelkan.private 1.0 as Private
 Private.SlideableBase {
     id: view
 
+    /*! Milliseconds between moving on by itself; 0 (the default) never does. */
     property int interval: 0
 
     loops: true

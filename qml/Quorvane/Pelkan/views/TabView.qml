@@ -10,16 +10,27 @@ import Quorvane.Pelkan.private 1.0 as Private
 Item {
     id: tabs
 
+    /*! The tabs: a list of titles, or a model with a "title" role. */
     property alias model: pages.model
+    /*! Makes a tab's page when it is first shown; sees index, modelData and the roles. */
     property alias delegate: pages.delegate
+    /*! The tab shown; whatever order it is declared in against the model. */
     property alias currentIndex: pages.currentIndex
+    /*! The page of the current tab. */
     readonly property alias currentItem: pages.currentItem
+    /*! How many tabs there are. */
     readonly property alias count: pages.count
+    /*! How many pages besides the current one are kept alive (0: only the current). */
     property alias cacheSize: pages.cacheSize
+    /*! Whether a swipe changes tab (a tap on a title always does). */
     property alias interactive: pages.interactive
+    /*! True while the pages slide. */
     readonly property alias moving: pages.moving
+    /*! The sliding view of the pages, for Slide and drag settings. */
     readonly property Item view: pages
 
+    /*! Shows tab index, sliding there (TabViewAction.Animated, the default) or at once
+        (TabViewAction.Immediate). */
     function moveTo(index, operationType) {
         pages.moveTo(index, operationType === undefined ? TabViewAction.Animated : operationType)
     }
@@ -29,7 +40,7 @@ Item {
 
     Item {
         id: bar
-        width: parent.width
+        width: tabs.width
         height: Theme.itemSizeSmall
         readonly property real tabWidth: width / Math.max(1, pages.count)
 
@@ -37,15 +48,20 @@ Item {
             Repeater {
                 model: pages.model
                 MouseArea {
+                    id: tab
                     width: bar.tabWidth
                     height: bar.height
                     onClicked: tabs.moveTo(index)
+                    Accessible.role: Accessible.PageTab
+                    Accessible.name: typeof title !== "undefined" ? title : modelData
+                    Accessible.selected: index === pages.currentIndex
+                    Accessible.onPressAction: tabs.moveTo(index)
                     Text {
-                        anchors.centerIn: parent
-                        width: Math.min(implicitWidth, parent.width - Theme.paddingMedium)
+                        anchors.centerIn: tab
+                        width: Math.min(implicitWidth, tab.width - Theme.paddingMedium)
                         elide: Text.ElideRight
                         text: typeof title !== "undefined" ? title : modelData
-                        color: parent.pressed || index === pages.currentIndex ? Theme.highlightColor : Theme.primaryColor
+                        color: tab.pressed || index === pages.currentIndex ? Theme.highlightColor : Theme.primaryColor
                         font.pixelSize: Theme.fontSizeMedium
                     }
                 }
@@ -54,7 +70,7 @@ Item {
 
         // Follows the pages as they slide.
         Rectangle {
-            y: parent.height - height
+            y: bar.height - height
             x: pages.position * bar.tabWidth
             width: bar.tabWidth
             height: Math.max(2, Math.round(Theme.paddingSmall / 2))
@@ -64,7 +80,7 @@ Item {
 
     Private.SlideableBase {
         id: pages
-        anchors { top: bar.bottom; left: parent.left; right: parent.right; bottom: parent.bottom }
+        anchors { top: bar.bottom; left: tabs.left; right: tabs.right; bottom: tabs.bottom }
         cacheSize: 0
     }
 }
