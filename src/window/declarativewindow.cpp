@@ -204,7 +204,7 @@ void DeclarativeWindow::deactivate()
         m_window->showMinimized();
 }
 
-void DeclarativeWindow::_queueDeletion(QObject *object)
+void DeclarativeWindow::queueDeletion(QObject *object)
 {
     if (!object)
         return;

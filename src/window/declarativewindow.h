@@ -23,8 +23,8 @@ class WindowEventObserver;
 // Decisions beyond the orientation and publication rules:
 // - _pageOrientation follows orientation until it is written, and again after a reset.
 // - _orientationLocked freezes the orientation; unlocking re-selects it at once.
-// - _publishCategory sets the "CATEGORY" property to "pelkan"; the cover window pairs
-//   with application windows that publish it.
+// - publishCategory sets the "CATEGORY" property to "pelkan"; the cover window pairs
+//   with application windows that publish it. ApplicationWindow turns it on.
 // - _setCover(window) attaches a cover window: its properties and this window's are
 //   republished and the compositor is asked to retain the cover; the cover is detached
 //   again when it is destroyed or when _setCover(null) is called. _haveCoverHint follows:
@@ -32,7 +32,7 @@ class WindowEventObserver;
 //   written in between).
 // - _coverVisible is true while a cover is attached and the application window is not
 //   visible in the foreground (or the cover is the primary window); reset recomputes it.
-// - _queueDeletion(object) deletes the object once the next frame has been rendered, so
+// - queueDeletion(object) deletes the object once the next frame has been rendered, so
 //   that the scene graph never sees a deleted item; _processPendingDeletions() does it
 //   at once, and happens also when the GL context goes away and before the app quits.
 // - deactivate() minimises the window, which sends the application to the background.
@@ -52,7 +52,7 @@ class DeclarativeWindow : public Pelkan::Control
     Q_PROPERTY(bool _persistentOpenGLContext READ persistentOpenGLContext WRITE setPersistentOpenGLContext)
     Q_PROPERTY(bool _persistentSceneGraph READ persistentSceneGraph WRITE setPersistentSceneGraph)
     Q_PROPERTY(bool _haveCoverHint READ haveCoverHint WRITE setHaveCoverHint NOTIFY haveCoverChanged)
-    Q_PROPERTY(bool _publishCategory READ publishCategory WRITE setPublishCategory NOTIFY publishCategoryChanged)
+    Q_PROPERTY(bool publishCategory READ publishCategory WRITE setPublishCategory NOTIFY publishCategoryChanged)
     Q_PROPERTY(QColor _backgroundColor READ backgroundColor WRITE setBackgroundColor NOTIFY backgroundColorChanged)
     Q_PROPERTY(bool _coverIsPrimaryWindow READ coverIsPrimaryWindow WRITE setCoverIsPrimaryWindow NOTIFY coverIsPrimaryWindowChanged)
     Q_PROPERTY(bool _coverVisible READ coverVisible WRITE setCoverVisible RESET _updateCoverVisibility NOTIFY coverVisibleChanged)
@@ -118,7 +118,7 @@ public:
     // The window whose properties the compositor reads: the main window if set, else ours.
     QWindow *publicationTarget() const;
 
-    Q_INVOKABLE void _queueDeletion(QObject *object);
+    void queueDeletion(QObject *object);
 
     // Whether the system turns the display for applications (a desktop), unlike the
     // device's compositor, which leaves the display as it is built and turning to them.

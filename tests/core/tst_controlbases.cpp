@@ -18,6 +18,7 @@ class tst_ControlBases : public QObject
 private Q_SLOTS:
     void accessible_data();
     void accessible();
+    void rightToLeftApplicationsMirror();
 
 private:
     QQmlEngine m_engine;
@@ -110,6 +111,27 @@ void tst_ControlBases::accessible()
     }
     qDeleteAll(items);
     setAccessibilityActive(false);
+}
+
+// An application in a right-to-left language mirrors its pages: controls draw mirrored and
+// the slider's track runs from the right.
+void tst_ControlBases::rightToLeftApplicationsMirror()
+{
+    QQmlComponent component(&m_engine);
+    component.setData("import QtQuick 2.6\nimport Quorvane.Pelkan 1.0\n"
+                      "ApplicationWindow { width: 400; height: 600\n"
+                      "  initialPage: Component { Page { Slider { objectName: 'slider'; value: 0.25 } } } }", QUrl());
+    QScopedPointer<QObject> window(component.create());
+    QVERIFY2(window, qPrintable(component.errorString()));
+    QObject *slider = nullptr;
+    QTRY_VERIFY((slider = window->findChild<QObject *>(QStringLiteral("slider"))));
+    QCOMPARE(slider->property("mirrored").toBool(), false);
+    QCOMPARE(slider->property("visualPosition").toReal(), 0.25);
+    QGuiApplication::setLayoutDirection(Qt::RightToLeft);
+    QCOMPARE(slider->property("mirrored").toBool(), true);
+    QCOMPARE(slider->property("visualPosition").toReal(), 0.75);
+    QGuiApplication::setLayoutDirection(Qt::LeftToRight);
+    QCOMPARE(slider->property("mirrored").toBool(), false);
 }
 
 QTEST_MAIN(tst_ControlBases)

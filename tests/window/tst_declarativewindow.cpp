@@ -425,7 +425,7 @@ void tst_DeclarativeWindow::queuedDeletionWaitsForAFrame()
     auto item = new QQuickItem(window);
     QPointer<QQuickItem> guard(item);
     item->setParentItem(nullptr);
-    window->_queueDeletion(item);
+    window->queueDeletion(item);
     QVERIFY(guard);
     QTRY_VERIFY(guard.isNull());
 
@@ -433,7 +433,7 @@ void tst_DeclarativeWindow::queuedDeletionWaitsForAFrame()
     DeclarativeWindow loose;
     auto object = new QObject;
     QPointer<QObject> looseGuard(object);
-    loose._queueDeletion(object);
+    loose.queueDeletion(object);
     QTRY_VERIFY(looseGuard.isNull());
 }
 

@@ -23,7 +23,7 @@ Window {
         id: applicationWindow
         anchors.fill: parent
         focus: true
-        _publishCategory: root.category
+        publishCategory: root.category
         _backgroundRect: Qt.rect(0, 10, root.width, root.backgroundHeight)
         // Keep the cover on show while the application is in front.
         _coverIsPrimaryWindow: true

@@ -33,6 +33,11 @@ Private.Window {
     property bool showFrameRate: false
 
     _allowedOrientations: (allowedOrientations & internal.pageOrientations) || allowedOrientations
+    // A toolkit application: the home screen pairs its cover with it.
+    publishCategory: true
+    // Right to left for a right-to-left language: every page, control and layout in it mirrors.
+    LayoutMirroring.enabled: Qt.application.layoutDirection === Qt.RightToLeft
+    LayoutMirroring.childrenInherit: true
     _backgroundColor: palette.backgroundColor
     focus: true
 
