@@ -42,15 +42,21 @@ void RemorseCache::watchModel()
     connect(m_model, &QAbstractItemModel::rowsMoved, this, &RemorseCache::followRows);
     connect(m_model, &QAbstractItemModel::layoutChanged, this, &RemorseCache::followRows);
     connect(m_model, &QAbstractItemModel::modelReset, this, &RemorseCache::followRows);
-    connect(m_model, &QObject::destroyed, this, &RemorseCache::followRows);
+    connect(m_model, &QObject::destroyed, this, [this] { endAll(Dropped); });
+}
+
+void RemorseCache::endAll(Ending ending)
+{
+    const QVector<RemorseCountdown *> running = m_countdowns;
+    for (RemorseCountdown *countdown : running)
+        end(countdown, ending);
 }
 
 void RemorseCache::modelReplaced()
 {
-    // Rows of the old model mean nothing in the new one.
-    const QVector<RemorseCountdown *> ending = m_countdowns;
-    for (RemorseCountdown *countdown : ending)
-        end(countdown, Left);
+    // Rows of the old model mean nothing in the new one. (A model that was destroyed has
+    // ended its countdowns already.)
+    endAll(Left);
     watchModel();
 }
 
@@ -63,7 +69,6 @@ void RemorseCache::followRows()
     }
     for (RemorseCountdown *countdown : qAsConst(left))
         end(countdown, Left);
-    Q_EMIT updated();
 }
 
 RemorseCountdown *RemorseCache::find(int row) const
@@ -94,7 +99,6 @@ QObject *RemorseCache::start(int row, int timeout, const QJSValue &action, const
     m_countdowns.append(countdown);
     schedule();
     Q_EMIT countChanged();
-    Q_EMIT updated();
     Q_EMIT started(row);
     return countdown;
 }
@@ -115,16 +119,14 @@ void RemorseCache::end(RemorseCountdown *countdown, Ending ending)
     if (ending == Left) {
         qCWarning(lcPelkanCoreLog).nospace() << "RemorseCache: row " << row << " left the model during its countdown ("
                                              << countdown->text() << "); its action does not run";
-        countdown->m_row = -1;
-        Q_EMIT countdown->rowChanged();
     }
+    countdown->m_row = -1;
+    Q_EMIT countdown->rowChanged();
     schedule();
 
     QPointer<RemorseCache> self(this);
     QPointer<RemorseCountdown> guard(countdown);
     Q_EMIT countChanged();
-    if (self)
-        Q_EMIT updated();
     if (ending == Triggered) {
         QJSValue action = countdown->m_action;
         if (action.isCallable()) {

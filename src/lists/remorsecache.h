@@ -17,6 +17,7 @@ class RemorseCountdown;
 // Where the view's model is an item model (a ListModel is one), each countdown follows its row
 // through inserts, removes and moves. A countdown whose row leaves the model (removed, filtered
 // out, the model reset or replaced) ends with canceled() and a warning; its action never runs.
+// When the model itself is destroyed (its page popped), countdowns end with canceled() quietly.
 // Other models (a number, a script array) say nothing of their rows: a countdown keeps the row
 // it was started on, and all end that way when the view's model changes.
 class RemorseCache : public QObject
@@ -25,7 +26,9 @@ class RemorseCache : public QObject
     Q_PROPERTY(int count READ count NOTIFY countChanged)
 
 public:
-    enum Ending { Triggered, Canceled, Left };
+    // Left: its row left the model (a warning says so); Dropped: the model itself went,
+    // as when the page holding it is popped (no warning: nothing was lost).
+    enum Ending { Triggered, Canceled, Left, Dropped };
 
     explicit RemorseCache(QObject *view = nullptr);
     ~RemorseCache() override;
@@ -44,9 +47,6 @@ public:
 
 Q_SIGNALS:
     void countChanged();
-    // Any countdown started, ended or moved to another row. (Not "changed": QML would read
-    // a handler onChanged as the change of a property without a name.)
-    void updated();
     void started(int row);
     void triggered(int row);
     void canceled(int row);
@@ -60,6 +60,7 @@ private:
     void schedule();
     void watchModel();
     void followRows();
+    void endAll(Ending ending);
 
 private Q_SLOTS:
     void modelReplaced();

@@ -20,7 +20,7 @@ class RemorseCountdown : public QObject
 
 public:
     QString text() const { return m_text; }
-    // The row it counts down for now; -1 once the row has left the model.
+    // The row it counts down for now; -1 once it has ended.
     int row() const { return m_row; }
 
     // Milliseconds left, 0 once it has ended.

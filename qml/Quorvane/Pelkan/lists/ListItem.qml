@@ -22,7 +22,7 @@ Item {
 
     // Remorse: a countdown the view keeps for this row, shown over the row while it runs.
     /*! True while a remorse countdown runs for this row. */
-    readonly property bool remorseRunning: remorse.countdown !== null
+    readonly property bool remorseRunning: remorse.countdown !== null && remorse.countdown.row >= 0
     /*! Shows "Deleting in 5 s, tap to cancel" over the row (text "Deleting") and runs action
         when the countdown ends, after timeout ms (5000 if left out), unless a tap cancels it.
         The countdown is kept by the view: it follows the row while rows are inserted,
@@ -31,39 +31,42 @@ Item {
         triggered() and canceled() tell how it ended (canceled() also when the row leaves the
         model), or null outside a ListView. */
     function remorseAction(text, action, timeout) {
-        if (!remorse.cache) {
+        var cache = remorse.cache()
+        if (!cache) {
             console.warn("ListItem: remorse needs a ListView")
             return null
         }
-        return remorse.cache.start(remorse.row, timeout === undefined ? 5000 : timeout, action, text || "")
+        remorse.countdown = cache.start(remorse.row, timeout === undefined ? 5000 : timeout, action, text || "")
+        return remorse.countdown
     }
     QtObject {
         id: remorse
         readonly property int row: item.DelegateModel.itemsIndex
-        readonly property var cache: item.ListView.view ? item.ListView.view.RemorseCache : null
-        property var watched: null
+        // The countdown shown; the view's cache deletes it when it ends.
         property QtObject countdown: null
         property Item overlay: null
+        function cache() {
+            var view = item.ListView.view
+            return view ? view.RemorseCache : null
+        }
         function follow() {
-            countdown = cache && row >= 0 ? cache.at(row) : null
+            var running = cache()
+            countdown = running && row >= 0 ? running.at(row) : null
         }
-        function watch() {
-            if (watched)
-                watched.updated.disconnect(follow)
-            watched = cache
-            if (watched)
-                watched.updated.connect(follow)
-            follow()
-        }
-        onRowChanged: follow()
-        onCacheChanged: watch()
-        Component.onCompleted: watch() // a countdown may be running for this row already
-        Component.onDestruction: if (watched) watched.updated.disconnect(follow)
+        onRowChanged: refollow.restart()
+        Component.onCompleted: follow() // a countdown may be running for this row already
         onCountdownChanged: {
             if (overlay)
                 overlay.destroy()
             overlay = countdown ? remorseComponent.createObject(item, { "countdown": countdown }) : null
         }
+    }
+    // Once the model's change has reached the cache too: the view may hand its delegates
+    // their new rows first. (A timer goes with the delegate; a deferred call would not.)
+    Timer {
+        id: refollow
+        interval: 0
+        onTriggered: remorse.follow()
     }
     Component {
         id: remorseComponent

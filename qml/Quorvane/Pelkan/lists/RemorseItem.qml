@@ -23,6 +23,7 @@ MouseArea {
 
     anchors.fill: parent
     z: 10
+    visible: countdown !== null && countdown.row >= 0
     activeFocusOnTab: true
     onClicked: cancel()
     Keys.onSpacePressed: cancel()
@@ -53,22 +54,22 @@ MouseArea {
 
     // An opaque ground first: the row's content must not show through the words.
     Rectangle {
-        anchors.fill: parent
+        anchors.fill: remorse
         color: Theme.rgba(Theme.overlayBackgroundColor, 1)
     }
     Rectangle {
-        anchors.fill: parent
+        anchors.fill: remorse
         color: Theme.highlightBackgroundColor
         opacity: 0.3
     }
     Text {
         id: label
         anchors {
-            left: parent.left
-            right: parent.right
+            left: remorse.left
+            right: remorse.right
             leftMargin: Theme.horizontalPageMargin
             rightMargin: Theme.horizontalPageMargin
-            verticalCenter: parent.verticalCenter
+            verticalCenter: remorse.verticalCenter
         }
         horizontalAlignment: Text.AlignLeft
         elide: Text.ElideRight

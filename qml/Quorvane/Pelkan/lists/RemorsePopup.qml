@@ -107,23 +107,25 @@ MouseArea {
 
     // Outside a window with an overlay, a plain opaque background.
     Rectangle {
-        anchors.fill: parent
+        id: plain
+        anchors.fill: popup
         visible: internal.home === null
         color: Theme.rgba(Theme.overlayBackgroundColor, 1)
         Rectangle {
-            anchors.fill: parent
+            anchors.fill: plain
             color: Theme.highlightBackgroundColor
             opacity: 0.3
         }
     }
     Text {
         id: label
+        // By id, not parent: bindings may run again while the popup is torn down.
         anchors {
-            left: parent.left
-            right: parent.right
+            left: popup.left
+            right: popup.right
             leftMargin: Theme.horizontalPageMargin
             rightMargin: Theme.horizontalPageMargin
-            verticalCenter: parent.verticalCenter
+            verticalCenter: popup.verticalCenter
         }
         elide: Text.ElideRight
         text: popup.text.length ? qsTrId("quorvanepelkan-la-remorse_action").arg(popup.text).arg(popup.secondsLeft)

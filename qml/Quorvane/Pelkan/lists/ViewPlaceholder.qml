@@ -44,17 +44,18 @@ Item {
         }
     }
 
-    onFlickableChanged: internal.place()
+    onFlickableChanged: Qt.callLater(internal.place)
     Component.onCompleted: internal.place()
 
     Column {
-        anchors.verticalCenter: parent.verticalCenter
+        id: column
+        anchors.verticalCenter: placeholder.verticalCenter
         x: Theme.horizontalPageMargin
-        width: parent.width - 2 * Theme.horizontalPageMargin
+        width: placeholder.width - 2 * Theme.horizontalPageMargin
         spacing: Theme.paddingMedium
 
         Text {
-            width: parent.width
+            width: column.width
             horizontalAlignment: Text.AlignHCenter
             wrapMode: Text.Wrap
             text: placeholder.text
@@ -62,7 +63,7 @@ Item {
             font.pixelSize: Theme.fontSizeLarge
         }
         Text {
-            width: parent.width
+            width: column.width
             horizontalAlignment: Text.AlignHCenter
             wrapMode: Text.Wrap
             visible: text.length > 0

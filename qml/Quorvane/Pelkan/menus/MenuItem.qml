@@ -33,7 +33,7 @@ Text {
 
     MouseArea {
         id: tap
-        anchors.fill: parent
+        anchors.fill: item
         enabled: internal.menu !== null && internal.menu.tapToPick
         onPressed: Private.Util.playTouchFeedback()
         onClicked: {

@@ -132,7 +132,7 @@ Item {
         }
     }
 
-    onFlickableChanged: internal.attach()
+    onFlickableChanged: Qt.callLater(internal.attach)
     Component.onCompleted: {
         if (!flickable)
             console.warn((pullDown ? "PullDownMenu" : "PushUpMenu")
@@ -187,7 +187,7 @@ Item {
 
     // A glow of the highlight colour, strongest at the far end of the menu.
     OverlayGradient {
-        anchors.fill: parent
+        anchors.fill: host
         color: Theme.highlightBackgroundColor
         direction: host.pullDown ? OpacityRamp.BottomToTop : OpacityRamp.TopToBottom
         slope: 0.3
