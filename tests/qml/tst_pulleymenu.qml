@@ -23,6 +23,26 @@ Item {
         log.push({ name: name, view: view, contentY: view.contentY, moving: view.moving, dragging: view.dragging })
     }
 
+    // The same menus in every view, made in it as its declared children are.
+    Component {
+        id: downMenu
+        PullDownMenu {
+            id: menu
+            MenuLabel { text: "Label" }
+            MenuItem { text: "First"; onClicked: root.picked(text, menu) }
+            MenuItem { text: "Second"; onClicked: root.picked(text, menu) }
+            MenuItem { text: "Third"; onClicked: root.picked(text, menu) }
+            MenuItem { text: "Fourth"; onClicked: root.picked(text, menu) }
+        }
+    }
+    Component {
+        id: upMenu
+        PushUpMenu {
+            id: menu
+            MenuItem { text: "Up"; onClicked: root.picked(text, menu) }
+        }
+    }
+
     ApplicationWindow {
         id: app
         anchors.fill: parent
@@ -39,16 +59,7 @@ Item {
                         contentHeight: root.rows * 50
                         property Item pullDownMenu
                         property Item pushUpMenu
-                        PullDownMenu {
-                            MenuLabel { text: "Label" }
-                            MenuItem { text: "First"; onClicked: root.picked("First", flickable.pullDownMenu) }
-                            MenuItem { text: "Second"; onClicked: root.picked("Second", flickable.pullDownMenu) }
-                            MenuItem { text: "Third"; onClicked: root.picked("Third", flickable.pullDownMenu) }
-                            MenuItem { text: "Fourth"; onClicked: root.picked("Fourth", flickable.pullDownMenu) }
-                        }
-                        PushUpMenu {
-                            MenuItem { text: "Up"; onClicked: root.picked("Up", flickable.pushUpMenu) }
-                        }
+                        Component.onCompleted: [downMenu, upMenu].forEach(function(menu) { menu.createObject(contentItem) })
                     }
                     ListView {
                         id: list
@@ -59,16 +70,7 @@ Item {
                         delegate: Item { width: list.width; height: 50 }
                         property Item pullDownMenu
                         property Item pushUpMenu
-                        PullDownMenu {
-                            MenuLabel { text: "Label" }
-                            MenuItem { text: "First"; onClicked: root.picked("First", list.pullDownMenu) }
-                            MenuItem { text: "Second"; onClicked: root.picked("Second", list.pullDownMenu) }
-                            MenuItem { text: "Third"; onClicked: root.picked("Third", list.pullDownMenu) }
-                            MenuItem { text: "Fourth"; onClicked: root.picked("Fourth", list.pullDownMenu) }
-                        }
-                        PushUpMenu {
-                            MenuItem { text: "Up"; onClicked: root.picked("Up", list.pushUpMenu) }
-                        }
+                        Component.onCompleted: [downMenu, upMenu].forEach(function(menu) { menu.createObject(list) })
                         ViewPlaceholder {
                             id: placeholder
                             enabled: root.rows === 0
@@ -85,16 +87,7 @@ Item {
                         delegate: Item { width: 50; height: 50 }
                         property Item pullDownMenu
                         property Item pushUpMenu
-                        PullDownMenu {
-                            MenuLabel { text: "Label" }
-                            MenuItem { text: "First"; onClicked: root.picked("First", grid.pullDownMenu) }
-                            MenuItem { text: "Second"; onClicked: root.picked("Second", grid.pullDownMenu) }
-                            MenuItem { text: "Third"; onClicked: root.picked("Third", grid.pullDownMenu) }
-                            MenuItem { text: "Fourth"; onClicked: root.picked("Fourth", grid.pullDownMenu) }
-                        }
-                        PushUpMenu {
-                            MenuItem { text: "Up"; onClicked: root.picked("Up", grid.pushUpMenu) }
-                        }
+                        Component.onCompleted: [downMenu, upMenu].forEach(function(menu) { menu.createObject(grid) })
                     }
                 }
             }
