@@ -44,7 +44,13 @@ Item {
         }
     }
 
-    onFlickableChanged: Qt.callLater(internal.place)
+    // Moved after a change of view, not inside its handler (the view is read from the parent).
+    onFlickableChanged: placeLater.restart()
+    Timer {
+        id: placeLater
+        interval: 0
+        onTriggered: internal.place()
+    }
     Component.onCompleted: internal.place()
 
     Column {

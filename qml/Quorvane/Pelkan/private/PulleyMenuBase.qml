@@ -70,6 +70,8 @@ Item {
             : Math.max(top, view.originY + view.contentHeight + view.bottomMargin - view.height)
         // Picked on letting go; runs once the content rests at its edge.
         property Item pending: null
+        // Let go with the menu out: the content is to be taken back.
+        property bool settling: false
 
         // The picked item whose middle the revealed part has reached last.
         function itemAt(distance) {
@@ -132,7 +134,7 @@ Item {
         }
     }
 
-    onFlickableChanged: Qt.callLater(internal.attach)
+    onFlickableChanged: later.restart()
     Component.onCompleted: {
         if (!flickable)
             console.warn((pullDown ? "PullDownMenu" : "PushUpMenu")
@@ -152,17 +154,35 @@ Item {
                 // The finger takes over: what was picked before is dropped.
                 snap.stop()
                 internal.pending = null
+                internal.settling = false
                 return
             }
             // A cancelled touch picks nothing and leaves the content to the flickable.
             var out = logic.dragDistance > 0 && !logic.canceled
             internal.pending = out ? column.highlightedItem : null
             column.highlightedItem = null
-            if (out)
-                Qt.callLater(internal.settle)
+            if (out) {
+                internal.settling = true
+                later.restart()
+            }
         }
         function onMovementEnded() { internal.run() }
         function onFlickStarted() { logic.monitorFlick() }
+    }
+
+    // The next turn of the event loop: after the flickable has handled the letting go, or
+    // after a change of flickable has settled. (A timer goes with the menu; a deferred call
+    // would outlive it.)
+    Timer {
+        id: later
+        interval: 0
+        onTriggered: {
+            internal.attach()
+            if (internal.settling) {
+                internal.settling = false
+                internal.settle()
+            }
+        }
     }
 
     Private.PulleyMenuLogic {
