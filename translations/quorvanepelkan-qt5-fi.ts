@@ -145,6 +145,26 @@
         <extracomment>Placeholder of an empty list</extracomment>
         <translation>Ei kohteita</translation>
     </message>
+    <message id="quorvanepelkan-la-pull_down_menu">
+        <source>Pull-down menu</source>
+        <extracomment>Accessible name of the menu above a list, opened by pulling the list down</extracomment>
+        <translation>Alasvetovalikko</translation>
+    </message>
+    <message id="quorvanepelkan-la-push_up_menu">
+        <source>Push-up menu</source>
+        <extracomment>Accessible name of the menu below a list, opened by pushing the list up past its end</extracomment>
+        <translation>Ylöstyöntövalikko</translation>
+    </message>
+    <message id="quorvanepelkan-la-remorse">
+        <source>In %1 s, tap to cancel</source>
+        <extracomment>Countdown before an action that can still be cancelled; %1 is the number of seconds left</extracomment>
+        <translation>%1 s kuluttua, peru napauttamalla</translation>
+    </message>
+    <message id="quorvanepelkan-la-remorse_action">
+        <source>%1 in %2 s, tap to cancel</source>
+        <extracomment>Countdown before an action that can still be cancelled; %1 is what will happen (&quot;Deleting&quot;), %2 the number of seconds left</extracomment>
+        <translation>%1 %2 s kuluttua, peru napauttamalla</translation>
+    </message>
     <message id="quorvanepelkan-megabytes">
         <source>%1 MB</source>
         <extracomment>File size in megabytes</extracomment>

@@ -92,6 +92,9 @@ void PulleyMenuLogic::setActive(bool active)
     if (!m_menu)
         return;
     if (active) {
+        // Activation happens only while the content is dragged: a finger (or the mouse) is down.
+        m_fingerDown = true;
+        setCanceled(false);
         PropertyCache::write(m_menu, "active", true);
         if (!m_window) {
             m_window = DeclarativeWindow::findWindow(qobject_cast<QQuickItem *>(m_flickable));
@@ -107,10 +110,47 @@ void PulleyMenuLogic::setActive(bool active)
     }
 }
 
-void PulleyMenuLogic::windowEvent(QEvent *)
+void PulleyMenuLogic::setCanceled(bool canceled)
 {
-    // Registration keeps the menu informed of the window while it is active; the
-    // flickable's own signals carry everything the logic decides on.
+    if (canceled == m_canceled)
+        return;
+    m_canceled = canceled;
+    Q_EMIT canceledChanged();
+}
+
+void PulleyMenuLogic::windowEvent(QEvent *event)
+{
+    // Events reach observers before the window delivers them, so by the time the
+    // flickable reports the end of its drag, this knows how the drag ended.
+    switch (event->type()) {
+    case QEvent::MouseButtonRelease:
+        m_fingerDown = false;
+        break;
+    case QEvent::TouchCancel:
+    case QEvent::UngrabMouse:
+        if (m_fingerDown) {
+            m_fingerDown = false;
+            setCanceled(true);
+        }
+        break;
+    default:
+        break;
+    }
+}
+
+void PulleyMenuLogic::followFinger()
+{
+    auto *menu = qobject_cast<QQuickItem *>(m_menu.data());
+    if (!menu)
+        return;
+    const qreal inactive = readReal(m_menu, "_inactivePosition");
+    const qreal contentY = readReal(m_flickable, "contentY");
+    const qreal pulled = m_pullDownType ? inactive - contentY : contentY - inactive;
+    if (pulled <= 0)
+        return;
+    const qreal extent = menu->height();
+    const qreal follow = pulled <= extent / 2 ? 2 * pulled : pulled + extent / 2;
+    PropertyCache::write(m_flickable, "contentY", m_pullDownType ? inactive - follow : inactive + follow);
 }
 
 void PulleyMenuLogic::updateDragDistance()
@@ -156,13 +196,16 @@ void PulleyMenuLogic::flickableContentYChanged()
     QPointer<PulleyMenuLogic> self(this);
 
     const bool out = outOfBounds();
-    updateDragDistance();
+    const bool dragging = readBool(m_flickable, "dragging");
     const bool active = readBool(m_menu, "active");
-    if (out && !active && readBool(m_flickable, "dragging") && !readBool(m_menu, "_activationInhibited"))
+    if (out && !active && dragging && !readBool(m_menu, "_activationInhibited"))
         setActive(true);
     else if (!out && active)
         setActive(false);
+    if (out && dragging && readBool(m_menu, "active"))
+        followFinger();
     clampContent();
+    updateDragDistance();
     if (readReal(m_flickable, "contentY") == readReal(m_menu, "_finalPosition"))
         Q_EMIT finalPositionReached();
 

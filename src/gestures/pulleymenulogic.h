@@ -32,6 +32,16 @@ class DeclarativeWindow;
 //   at _maxDragPosition at the bottom when the flickable has no usable push-up menu, and a
 //   push-up menu stops it at originY at the top when there is no usable pull-down menu.
 // - flickEnded() deactivates a menu that is back in bounds and ends flick monitoring.
+// - While the user drags an active menu out, the content follows the finger one to one
+//   until the whole menu (the height of the menu item) is out, and at half the finger's
+//   pace beyond that. The flickable itself moves content past its edge at half the
+//   finger's pace from the start, so each of its positions past the edge is doubled, up
+//   to the menu's height, and shifted by half the menu's height beyond it; a menu that
+//   fits the view can then be opened entirely by one drag from the edge.
+// - canceled tells whether the drag that brought the menu out ended without the finger
+//   lifting (the system cancelled the touch, or another item took the mouse grab); it is
+//   cleared when the menu activates again. It is seen only through the application
+//   window's events, so outside one it stays false.
 class PulleyMenuLogic : public QObject, public QQmlParserStatus, public WindowEventObserver
 {
     Q_OBJECT
@@ -39,6 +49,7 @@ class PulleyMenuLogic : public QObject, public QQmlParserStatus, public WindowEv
     Q_PROPERTY(bool pullDownType READ pullDownType WRITE setPullDownType NOTIFY pullDownTypeChanged)
     Q_PROPERTY(QObject *flickable READ flickable WRITE setFlickable NOTIFY flickableChanged)
     Q_PROPERTY(float dragDistance READ dragDistance NOTIFY dragDistanceChanged)
+    Q_PROPERTY(bool canceled READ canceled NOTIFY canceledChanged)
 
 public:
     explicit PulleyMenuLogic(QObject *parent = nullptr);
@@ -49,6 +60,7 @@ public:
     QObject *flickable() const { return m_flickable; }
     void setFlickable(QObject *flickable);
     float dragDistance() const { return m_dragDistance; }
+    bool canceled() const { return m_canceled; }
 
     Q_INVOKABLE bool outOfBounds() const;
     Q_INVOKABLE void monitorFlick();
@@ -66,6 +78,7 @@ Q_SIGNALS:
     void pullDownTypeChanged(bool arg);
     void animateFlick(float duration, float position);
     void dragDistanceChanged();
+    void canceledChanged();
 
 public Q_SLOTS:
     void flickableContentYChanged();
@@ -77,6 +90,8 @@ private:
     bool menuUsable(const QObject *menu) const;
     void setActive(bool active);
     bool clampContent();
+    void followFinger();
+    void setCanceled(bool canceled);
     void updateDragDistance();
 
     QPointer<QObject> m_menu;
@@ -86,4 +101,6 @@ private:
     float m_dragDistance = 0;
     int m_monitorState = 0;
     bool m_updating = false;
+    bool m_fingerDown = false;
+    bool m_canceled = false;
 };

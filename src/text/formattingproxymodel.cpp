@@ -75,12 +75,16 @@ void FormattingProxyModel::setSourceModel(QAbstractItemModel *model)
     endResetModel();
 }
 
-void FormattingProxyModel::resolveRoles()
+void FormattingProxyModel::resolveRoles() const
 {
     QAbstractItemModel *source = sourceModel();
-    if (!source)
+    const QHash<int, QByteArray> sourceRoles = source ? source->roleNames() : QHash<int, QByteArray>();
+    m_resolved = !sourceRoles.isEmpty();
+    if (!m_resolved) {
+        for (Format &format : m_formats)
+            format.role = -1;
         return;
-    const QHash<int, QByteArray> sourceRoles = source->roleNames();
+    }
     int next = Qt::UserRole;
     for (auto it = sourceRoles.cbegin(); it != sourceRoles.cend(); ++it)
         next = qMax(next, it.key() + 1);
@@ -107,7 +111,13 @@ int FormattingProxyModel::sourceRoleOf(const Format &format) const
 
 QHash<int, QByteArray> FormattingProxyModel::roleNames() const
 {
-    QHash<int, QByteArray> names = QIdentityProxyModel::roleNames();
+    // The source's names as they are now: the base class keeps those it saw when the source
+    // was set, none for a ListModel that had no rows then.
+    QHash<int, QByteArray> names = sourceModel() ? sourceModel()->roleNames() : QHash<int, QByteArray>();
+    if (names.isEmpty())
+        return names;
+    if (!m_resolved)
+        resolveRoles();
     for (const Format &format : m_formats) {
         if (format.role >= 0)
             names.insert(format.role, format.name);
@@ -118,7 +128,7 @@ QHash<int, QByteArray> FormattingProxyModel::roleNames() const
 const FormattingProxyModel::Format *FormattingProxyModel::formatForRole(int role) const
 {
     for (const Format &format : m_formats) {
-        if (format.role == role)
+        if (role >= 0 && format.role == role)
             return &format;
     }
     return nullptr;
@@ -152,7 +162,7 @@ void FormattingProxyModel::sourceDataChanged(const QModelIndex &topLeft, const Q
     QVector<int> formatted;
     for (const Format &format : qAsConst(m_formats)) {
         const int sourceRole = sourceRoleOf(format);
-        if (sourceRole >= 0 && (roles.isEmpty() || roles.contains(sourceRole)))
+        if (format.role >= 0 && sourceRole >= 0 && (roles.isEmpty() || roles.contains(sourceRole)))
             formatted.append(format.role);
     }
     if (!formatted.isEmpty())
@@ -163,7 +173,7 @@ void FormattingProxyModel::refresh()
 {
     QVector<int> formatted;
     for (const Format &format : qAsConst(m_formats)) {
-        if (sourceRoleOf(format) >= 0)
+        if (format.role >= 0 && sourceRoleOf(format) >= 0)
             formatted.append(format.role);
     }
     const int rows = rowCount();

@@ -26,6 +26,11 @@
 // changes whenever its source role does; refresh() announces all of them again, for texts
 // that change with time. Entries with an unknown operation, a missing name or a source
 // role the model does not have are ignored with a warning.
+//
+// Role names are the source's as they are when asked (a QML ListModel names its roles only
+// once its first row arrives), and the formatted roles are numbered once the source names
+// any: until then the proxy names none, so that a view reading them then sees no formatted
+// role without its source.
 class FormattingProxyModel : public QIdentityProxyModel
 {
     Q_OBJECT
@@ -59,13 +64,16 @@ private:
     };
 
     void parseFormats();
-    void resolveRoles();
+    void resolveRoles() const;
     void sourceDataChanged(const QModelIndex &topLeft, const QModelIndex &bottomRight, const QVector<int> &roles);
     const Format *formatForRole(int role) const;
     int sourceRoleOf(const Format &format) const;
 
     DeclarativeFormatter m_formatter;
     QVariantList m_formatEntries;
-    QVector<Format> m_formats;
+    // Role numbers are given once the source names its roles; mutable, since that may
+    // first be seen in roleNames().
+    mutable QVector<Format> m_formats;
+    mutable bool m_resolved = false;
     QMetaObject::Connection m_sourceConnection;
 };

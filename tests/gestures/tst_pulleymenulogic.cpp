@@ -1,5 +1,6 @@
 #include "gestures/pulleymenulogic.h"
 
+#include <QQuickItem>
 #include <QtTest>
 
 #include <cmath>
@@ -58,11 +59,11 @@ Q_SIGNALS:
     void flickEnded();
 };
 
-class FakeMenu : public QObject
+// The menu as the logic sees it: an item (its height is how far it reaches) with the
+// properties the logic reads by name.
+class FakeMenu : public QQuickItem
 {
     Q_OBJECT
-    Q_PROPERTY(bool enabled MEMBER enabled)
-    Q_PROPERTY(bool visible MEMBER visible)
     Q_PROPERTY(bool active MEMBER active)
     Q_PROPERTY(qreal _inactivePosition MEMBER inactivePosition)
     Q_PROPERTY(qreal _snapThreshold MEMBER snapThreshold)
@@ -73,11 +74,9 @@ class FakeMenu : public QObject
     Q_PROPERTY(bool _changingListView MEMBER changingListView)
     Q_PROPERTY(QObject *_contentColumn MEMBER contentColumn)
     Q_PROPERTY(qreal _maxDragPosition MEMBER maxDragPosition)
-    Q_PROPERTY(qreal height MEMBER height)
 
 public:
-    bool enabled = true;
-    bool visible = true;
+    FakeMenu() { setHeight(200); }
     bool active = false;
     qreal inactivePosition = 0;
     qreal snapThreshold = 100;
@@ -88,7 +87,6 @@ public:
     bool changingListView = false;
     QObject *contentColumn = nullptr;
     qreal maxDragPosition = 1200;
-    qreal height = 200;
 };
 
 class tst_PulleyMenuLogic : public QObject
@@ -108,6 +106,10 @@ private Q_SLOTS:
     void survivesMenuDestroyedBySnapHandler();
     void clampsFittingContent_data();
     void clampsFittingContent();
+    void contentFollowsTheFinger_data();
+    void contentFollowsTheFinger();
+    void knowsHowTheDragEnded_data();
+    void knowsHowTheDragEnded();
 
 private:
     FakeMenu *m_menu = nullptr;
@@ -152,10 +154,10 @@ void tst_PulleyMenuLogic::outOfBounds()
     QFETCH(qreal, contentY);
     QFETCH(qreal, columnHeight);
     QFETCH(bool, expected);
-    FakeMenu column;
-    column.height = columnHeight;
+    QQuickItem column;
+    column.setHeight(columnHeight);
     m_menu->contentColumn = &column;
-    m_menu->visible = usable;
+    m_menu->setVisible(usable);
     m_logic->setPullDownType(pullDown);
     m_flickable->contentY = contentY;
     QCOMPARE(m_logic->outOfBounds(), expected);
@@ -291,6 +293,67 @@ void tst_PulleyMenuLogic::clampsFittingContent()
     (pullDown ? m_flickable->pushUpMenu : m_flickable->pullDownMenu) = otherMenu ? &other : nullptr;
     m_flickable->setContentY(contentY);
     QCOMPARE(m_flickable->contentY, expected);
+}
+
+void tst_PulleyMenuLogic::contentFollowsTheFinger_data()
+{
+    // The flickable moves content past its edge at half the finger's pace; the menu is 200 high.
+    QTest::addColumn<bool>("pullDown");
+    QTest::addColumn<qreal>("flickablePosition");
+    QTest::addColumn<qreal>("expected");
+    QTest::newRow("pull-down, within the menu: doubled") << true << -40.0 << -80.0;
+    QTest::newRow("pull-down, at the menu's end") << true << -100.0 << -200.0;
+    QTest::newRow("pull-down, past the menu: half pace") << true << -150.0 << -250.0;
+    QTest::newRow("push-up, within the menu: doubled") << false << 30.0 << 60.0;
+    QTest::newRow("push-up, past the menu: half pace") << false << 120.0 << 220.0;
+}
+
+void tst_PulleyMenuLogic::contentFollowsTheFinger()
+{
+    QFETCH(bool, pullDown);
+    QFETCH(qreal, flickablePosition);
+    QFETCH(qreal, expected);
+    m_logic->setPullDownType(pullDown);
+    m_menu->pullDown = pullDown;
+    m_flickable->setDragging(true);
+    m_flickable->setContentY(flickablePosition);
+    QVERIFY(m_menu->active);
+    QCOMPARE(m_flickable->contentY, expected);
+    QCOMPARE(m_logic->dragDistance(), float(qAbs(expected)));
+
+    // Let go: the content is left to the flickable.
+    m_flickable->setDragging(false);
+    m_flickable->setContentY(flickablePosition);
+    QCOMPARE(m_flickable->contentY, flickablePosition);
+}
+
+void tst_PulleyMenuLogic::knowsHowTheDragEnded_data()
+{
+    QTest::addColumn<QList<int>>("events");
+    QTest::addColumn<bool>("canceled");
+    QTest::newRow("lifted") << QList<int> { QEvent::MouseButtonRelease, QEvent::UngrabMouse } << false;
+    QTest::newRow("touch cancelled") << QList<int> { QEvent::TouchCancel } << true;
+    QTest::newRow("grab taken") << QList<int> { QEvent::UngrabMouse, QEvent::MouseButtonRelease } << true;
+}
+
+void tst_PulleyMenuLogic::knowsHowTheDragEnded()
+{
+    QFETCH(QList<int>, events);
+    QFETCH(bool, canceled);
+    for (int round = 0; round < 2; ++round) {
+        m_flickable->setDragging(true);
+        m_flickable->setContentY(-40);
+        QVERIFY(m_menu->active);
+        QVERIFY(!m_logic->canceled());
+        for (int type : events) {
+            QEvent event { QEvent::Type(type) };
+            m_logic->windowEvent(&event);
+        }
+        m_flickable->setDragging(false);
+        QCOMPARE(m_logic->canceled(), canceled);
+        m_flickable->setContentY(0); // back at rest: the next drag starts afresh
+        QVERIFY(!m_menu->active);
+    }
 }
 
 QTEST_MAIN(tst_PulleyMenuLogic)

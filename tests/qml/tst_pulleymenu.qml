@@ -1,36 +1,96 @@
 import QtQuick 2.6
+import QtQuick.Window 2.2
 import QtTest 1.2
 import Quorvane.Pelkan 1.0
+import PelkanTest 1.0
 
-// Pull-down and push-up menus with real drags: how far the menu is out picks the item,
-// letting go runs it; pulled past the whole menu, nothing runs.
+// Pull-down and push-up menus declared inside a Flickable, a ListView and a GridView, with
+// real drags from the edge: how far the menu is out picks the item, letting go runs it once
+// the content rests at its edge; pulled clearly past the whole menu, or with the touch
+// cancelled, nothing runs. The window is as tall, against the pull-down menu, as a
+// 960 px window against a label and four items at pixel ratio 2.
 Item {
     id: root
-    width: 400
-    height: 1400
+    width: 600
+    height: Math.round((Theme.itemSizeSmall * 0.6 + 4 * Theme.itemSizeSmall * 0.75 + 2 * Theme.paddingLarge) / 0.7)
 
-    property var picked: []
-    property int contentHeight: 3000
+    property var log: []
+    property int rows: 40
+    readonly property var page: app.pageStack.currentPage
 
-    Flickable {
-        id: flickable
-        anchors.fill: parent
-        contentHeight: root.contentHeight
-        // Set by the menus themselves.
-        property Item pullDownMenu
-        property Item pushUpMenu
+    function picked(name, menu) {
+        var view = menu.flickable
+        log.push({ name: name, view: view, contentY: view.contentY, moving: view.moving, dragging: view.dragging })
+    }
 
+    // The same menus in every view, made in it as its declared children are.
+    Component {
+        id: downMenu
         PullDownMenu {
-            id: pullDown
-            busy: true
-            MenuItem { text: "First"; onClicked: root.picked.push("First") }
-            MenuLabel { text: "A label is never picked" }
-            MenuItem { text: "Second"; onClicked: root.picked.push("Second") }
+            id: menu
+            MenuLabel { text: "Label" }
+            MenuItem { text: "First"; onClicked: root.picked(text, menu) }
+            MenuItem { text: "Second"; onClicked: root.picked(text, menu) }
+            MenuItem { text: "Third"; onClicked: root.picked(text, menu) }
+            MenuItem { text: "Fourth"; onClicked: root.picked(text, menu) }
         }
+    }
+    Component {
+        id: upMenu
         PushUpMenu {
-            id: pushUp
-            MenuItem { text: "Third"; onClicked: root.picked.push("Third") }
-            MenuItem { text: "Fourth"; onClicked: root.picked.push("Fourth") }
+            id: menu
+            MenuItem { text: "Up"; onClicked: root.picked(text, menu) }
+        }
+    }
+
+    ApplicationWindow {
+        id: app
+        anchors.fill: parent
+        initialPage: Component {
+            Page {
+                property var views: [flickable, list, grid]
+                property alias placeholder: placeholder
+                Row {
+                    anchors.fill: parent
+                    Flickable {
+                        id: flickable
+                        width: parent.width / 3
+                        height: parent.height
+                        contentHeight: root.rows * 50
+                        property Item pullDownMenu
+                        property Item pushUpMenu
+                        Component.onCompleted: [downMenu, upMenu].forEach(function(menu) { menu.createObject(contentItem) })
+                    }
+                    ListView {
+                        id: list
+                        width: parent.width / 3
+                        height: parent.height
+                        model: root.rows
+                        header: Rectangle { width: list.width; height: 100; color: Theme.highlightBackgroundColor }
+                        delegate: Item { width: list.width; height: 50 }
+                        property Item pullDownMenu
+                        property Item pushUpMenu
+                        Component.onCompleted: [downMenu, upMenu].forEach(function(menu) { menu.createObject(list) })
+                        ViewPlaceholder {
+                            id: placeholder
+                            enabled: root.rows === 0
+                            text: "Nothing here"
+                        }
+                    }
+                    GridView {
+                        id: grid
+                        width: parent.width / 3
+                        height: parent.height
+                        model: root.rows
+                        cellWidth: width
+                        cellHeight: 50
+                        delegate: Item { width: 50; height: 50 }
+                        property Item pullDownMenu
+                        property Item pushUpMenu
+                        Component.onCompleted: [downMenu, upMenu].forEach(function(menu) { menu.createObject(grid) })
+                    }
+                }
+            }
         }
     }
 
@@ -38,59 +98,106 @@ Item {
         name: "PulleyMenu"
         when: windowShown
 
-        function test_menusKnowTheirFlickable() {
-            compare(flickable.pullDownMenu, pullDown)
-            compare(flickable.pushUpMenu, pushUp)
+        function init() {
+            root.log = []
+            root.rows = 40
+            for (var i = 0; i < 3; ++i)
+                root.page.views[i].contentY = root.page.views[i].originY - root.page.views[i].topMargin
         }
 
+        // How far the content must be out for the middle of a menu's nth child to show.
         function reveal(menu, nth) {
-            // The distance at which the middle of the nth picked item comes out.
-            var column = menu._contentColumn
-            var item = column.children[nth]
-            var middle = column.y + item.y + item.height / 2
-            return (menu._pullDown ? menu.height - middle : middle) + 4
+            var item = menu.content[nth === undefined ? menu.content.length - 1 : nth]
+            var middle = Theme.paddingLarge + item.y + item.height / 2
+            return (menu === menu.flickable.pullDownMenu ? menu.height - middle : middle) + 4
         }
 
-        function test_pull_data() {
-            return [
-                { tag: "down a little: nothing", menu: pullDown, distance: function() { return 10 }, picked: [] },
-                { tag: "down past the nearest item", menu: pullDown, distance: function() { return reveal(pullDown, 2) }, picked: ["Second"] },
-                { tag: "down past the label", menu: pullDown, distance: function() { return reveal(pullDown, 1) }, picked: ["Second"] },
-                { tag: "down past both", menu: pullDown, distance: function() { return reveal(pullDown, 0) }, picked: ["First"] },
-                { tag: "down past the whole menu: nothing", menu: pullDown, distance: function() { return pullDown.height + 20 }, picked: [] },
-                { tag: "down, content shorter than the view", menu: pullDown, content: 300,
-                  distance: function() { return reveal(pullDown, 2) }, picked: ["Second"] },
-                { tag: "up past the nearest item", menu: pushUp, distance: function() { return reveal(pushUp, 0) }, picked: ["Third"] },
-                { tag: "up past both", menu: pushUp, distance: function() { return reveal(pushUp, 1) }, picked: ["Fourth"] },
-                { tag: "up, content shorter than the view", menu: pushUp, content: 300,
-                  distance: function() { return reveal(pushUp, 0) }, picked: ["Third"] },
-            ]
-        }
-
-        function test_pull(data) {
-            root.picked = []
-            root.contentHeight = data.content || 3000
-            var down = data.menu === pullDown
-            flickable.contentY = down ? flickable.originY : data.menu._inactivePosition
-            var target = data.distance()
-            var y = down ? 20 : 1380
-            mousePress(flickable, 200, y)
-            mouseMove(flickable, 200, y + (down ? 6 : -6))
-            // Small steps, as a finger moves, until the menu is out that far (past its edge
-            // the content follows the finger less than one to one).
-            while (data.menu.dragDistance < target && y > 10 && y < 1390) {
-                y += down ? 6 : -6
-                mouseMove(flickable, 200, y)
+        // One drag from the view's edge (from where the finger can go furthest) in small
+        // steps, as a finger moves, until the menu is out that far or the finger reaches the
+        // window's other edge; then the finger lifts, or the system takes the touch away.
+        function pull(view, down, distance, input) {
+            var menu = down ? view.pullDownMenu : view.pushUpMenu
+            var x = view.width / 2
+            var y = down ? 1 : view.height - 1
+            var step = down ? 6 : -6
+            var touch = input === "mouse" ? null : touchEvent(view)
+            if (touch)
+                touch.press(0, view, x, y).commit()
+            else
+                mousePress(view, x, y)
+            for (var moves = 1; menu.dragDistance < distance && y + step > 0 && y + step < view.height; ++moves) {
+                y += step
+                if (touch)
+                    touch.move(0, view, x, y).commit()
+                else
+                    mouseMove(view, x, y)
+                if (input === "two fingers" && moves === 5)
+                    touch.stationary(0).press(1, view, x / 2, view.height / 2).commit()
                 wait(5)
             }
-            verify(data.menu.opacity > 0)
-            verify(data.menu.active)
-            mouseRelease(flickable, 200, y)
-            tryCompare(flickable, "moving", false)
-            tryCompare(data.menu, "_snapping", false)
-            compare(root.picked, data.picked)
-            compare(data.menu.highlightedItem, null)
-            tryCompare(data.menu, "active", false)
+            verify(menu.active)
+            verify(menu.dragDistance >= distance, "out by " + menu.dragDistance + " of " + distance)
+            if (input === "cancelled")
+                TouchSystem.cancel(root.Window.window)
+            else if (input === "two fingers")
+                touch.release(0, view, x, y).stationary(1).commit().release(1, view, x / 2, view.height / 2).commit()
+            else if (touch)
+                touch.release(0, view, x, y).commit()
+            else
+                mouseRelease(view, x, y)
+            return menu
+        }
+
+        function test_pick_data() {
+            var rows = []
+            var views = ["Flickable", "ListView", "GridView"]
+            for (var v = 0; v < 3; ++v) {
+                rows.push({ tag: views[v] + ", down to the nearest item", view: v, down: true, nth: 4, picked: "Fourth" })
+                rows.push({ tag: views[v] + ", down to the far item, in one drag", view: v, down: true, nth: 1, picked: "First" })
+                rows.push({ tag: views[v] + ", up, touch", view: v, down: false, input: "touch", picked: "Up" })
+            }
+            return rows.concat([
+                { tag: "the label is never picked", view: 0, down: true, nth: 0, picked: "First" },
+                { tag: "down a little: nothing", view: 0, down: true, distance: function() { return Theme.paddingLarge / 2 }, picked: undefined },
+                { tag: "the whole menu out and a bit: the far item", view: 0, down: true,
+                  distance: function(menu) { return menu.height + Theme.itemSizeLarge / 2 }, rows: 3, picked: "First" },
+                { tag: "up, one large item past the menu: still picked", view: 1, down: false,
+                  distance: function(menu) { return menu.height + Theme.itemSizeLarge * 0.9 }, picked: "Up" },
+                { tag: "up, clearly past the menu: nothing", view: 1, down: false,
+                  distance: function(menu) { return menu.height + Theme.itemSizeLarge * 1.2 }, picked: undefined },
+                { tag: "short content, down, touch", view: 1, down: true, nth: 2, rows: 2, input: "touch", picked: "Second" },
+                { tag: "short content, up", view: 0, down: false, rows: 2, picked: "Up" },
+                { tag: "short content, up, two fingers", view: 2, down: false, rows: 2, input: "two fingers", picked: "Up" },
+                { tag: "touch cancelled: nothing", view: 1, down: true, nth: 3, input: "cancelled", picked: undefined },
+            ])
+        }
+
+        function test_pick(data) {
+            if (data.rows !== undefined) {
+                root.rows = data.rows
+                init()
+            }
+            var view = root.page.views[data.view]
+            var menu = data.down ? view.pullDownMenu : view.pushUpMenu
+            var rest = data.down ? view.contentY : view.originY + Math.max(0, view.contentHeight - view.height)
+            view.contentY = rest
+            var distance = data.distance ? data.distance(menu) : reveal(menu, data.nth)
+            pull(view, data.down, distance, data.input || "mouse")
+            tryVerify(function() { return !view.moving && Math.abs(view.contentY - rest) < 0.5 }, 5000, "at " + view.contentY + " of " + rest + " " + view.moving + " log " + JSON.stringify(root.log))
+            wait(50)
+            if (data.picked === undefined) {
+                compare(root.log.length, 0, JSON.stringify(root.log))
+            } else {
+                compare(root.log.length, 1)
+                var run = root.log[0]
+                compare(run.name, data.picked)
+                compare(run.view, view)
+                // Run once the content rested at its edge, never while it was still out.
+                compare(run.contentY, rest)
+                verify(!run.moving && !run.dragging)
+            }
+            compare(menu.highlightedItem, null)
+            tryCompare(menu, "active", false)
         }
 
         // A flick towards the menu that would come to rest just short of the content's
@@ -103,19 +210,41 @@ Item {
         }
 
         function test_flickSnaps(data) {
-            root.contentHeight = 6000
-            var velocity = Math.min(2 * pullDown._snapCalculationVelocity, flickable.maximumFlickVelocity)
-            var travel = velocity * velocity / (2 * flickable.flickDeceleration)
-            flickable.contentY = flickable.originY + travel + data.short * pullDown._snapThreshold
-            flickable.flick(0, velocity)
-            tryCompare(flickable, "moving", false, 5000)
-            tryCompare(pullDown, "_snapping", false)
+            var view = root.page.views[0]
+            root.rows = 200
+            var velocity = Math.min(2000 * Theme.pixelRatio, view.maximumFlickVelocity)
+            var travel = velocity * velocity / (2 * view.flickDeceleration)
+            view.contentY = view.originY + travel + data.short * Theme.itemSizeSmall
+            view.flick(0, velocity)
+            tryCompare(view, "moving", false, 5000)
             if (data.snapped)
-                compare(flickable.contentY, flickable.originY)
-            else
-                verify(flickable.contentY - flickable.originY > pullDown._snapThreshold,
-                       "stopped at " + flickable.contentY)
-            compare(root.picked, [])
+                tryCompare(view, "contentY", view.originY)
+            wait(100)
+            if (!data.snapped)
+                verify(view.contentY - view.originY > Theme.itemSizeSmall, "stopped at " + view.contentY)
+            compare(root.log, [])
+        }
+
+        // An empty list shows its placeholder below its header, and both move with the
+        // content while it is pulled.
+        function test_placeholder() {
+            root.rows = 0
+            var view = root.page.views[1]
+            var placeholder = root.page.placeholder
+            var header = view.headerItem
+            tryCompare(placeholder, "visible", true)
+            function gap() { return placeholder.mapToItem(view, 0, 0).y - header.mapToItem(view, 0, header.height).y }
+            verify(gap() >= 0, "over the header by " + -gap())
+            compare(placeholder.mapToItem(view, 0, placeholder.height).y, view.height)
+            var before = gap()
+            var headerAt = header.mapToItem(view, 0, 0).y
+            mousePress(view, view.width / 2, 1)
+            for (var y = 7; y < view.height / 2; y += 6)
+                mouseMove(view, view.width / 2, y)
+            verify(header.mapToItem(view, 0, 0).y > headerAt + Theme.itemSizeSmall)
+            compare(gap(), before)
+            mouseRelease(view, view.width / 2, y)
+            tryCompare(view, "moving", false)
         }
     }
 }

@@ -1,4 +1,6 @@
+#include <QCoreApplication>
 #include <QQmlEngine>
+#include <QTranslator>
 #include <QQuickWindow>
 #include <QtQuickTest>
 #include <qpa/qwindowsysteminterface.h>
@@ -21,8 +23,13 @@ class Setup : public QObject
     Q_OBJECT
 
 public Q_SLOTS:
-    void qmlEngineAvailable(QQmlEngine *)
+    void qmlEngineAvailable(QQmlEngine *engine)
     {
+        // The components' words, from the catalogue of the build tree (an installed
+        // application reads the installed one).
+        auto catalogue = new QTranslator(engine);
+        if (catalogue->load(QStringLiteral("quorvanepelkan-qt5_eng_en"), QStringLiteral(CATALOGUE_DIR)))
+            QCoreApplication::installTranslator(catalogue);
         qmlRegisterSingletonType<TouchSystem>("PelkanTest", 1, 0, "TouchSystem",
                                               [](QQmlEngine *, QJSEngine *) -> QObject * { return new TouchSystem; });
     }

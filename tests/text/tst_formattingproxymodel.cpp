@@ -21,7 +21,6 @@ private Q_SLOTS:
     void formattedRoles();
     void sourceChangesReachFormattedRoles();
     void refreshAnnouncesEveryFormattedRole();
-    void rolesNamedLaterAreFound();
     void badFormatsAreIgnored();
 
 private:
@@ -110,20 +109,6 @@ void tst_FormattingProxyModel::refreshAnnouncesEveryFormattedRole()
     QCOMPARE(changed.first().at(2).value<QVector<int>>().size(), 4);
     QCOMPARE(m_proxy.data(m_proxy.index(0, 0), roleNamed("modifiedText")).toString(), QStringLiteral("1 hour ago"));
     FormatterSeams::setCurrentDateTimeForTesting(Now);
-}
-
-void tst_FormattingProxyModel::rolesNamedLaterAreFound()
-{
-    // Like a QML ListModel: no role names until the first row arrives.
-    QStandardItemModel source;
-    FormattingProxyModel proxy;
-    proxy.setSourceModel(&source);
-    proxy.setFormats({ format("sizeText", "size", "formatFileSize") });
-    source.setItemRoleNames({ { SizeRole, "size" } });
-    auto item = new QStandardItem;
-    item->setData(qlonglong(2048), SizeRole);
-    source.appendRow(item);
-    QCOMPARE(proxy.data(proxy.index(0, 0), proxy.roleNames().key("sizeText")).toString(), QStringLiteral("2.0 kB"));
 }
 
 void tst_FormattingProxyModel::badFormatsAreIgnored()

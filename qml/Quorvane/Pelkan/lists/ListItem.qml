@@ -19,55 +19,55 @@ Item {
     default property alias content: mouseArea.data
 
     property Item _menuItem: null
-    // The row in the view's model, and the view's cache of running remorse countdowns.
-    readonly property int _row: DelegateModel.itemsIndex
-    readonly property var _remorseCache: ListView.view ? ListView.view.RemorseCache : null
-    property Item _remorseItem: null
-    readonly property bool remorseRunning: _remorseItem !== null
 
-    // "Deleting in 5 s, tap to cancel" over the item; action runs when the countdown ends,
-    // also if the item has scrolled out of view meanwhile and its delegate is gone: make
-    // it in a scope that outlives the delegate (the page's or the view's), not inline here.
+    // Remorse: a countdown the view keeps for this row, shown over the row while it runs.
+    /*! True while a remorse countdown runs for this row. */
+    readonly property bool remorseRunning: remorse.countdown !== null && remorse.countdown.row >= 0
+    /*! Shows "Deleting in 5 s, tap to cancel" over the row (text "Deleting") and runs action
+        when the countdown ends, after timeout ms (5000 if left out), unless a tap cancels it.
+        The countdown is kept by the view: it follows the row while rows are inserted,
+        removed or moved, and outlives this delegate; make action in a scope that outlives
+        the delegate (the page's or the view's), not inline here. Returns the countdown, whose
+        triggered() and canceled() tell how it ended (canceled() also when the row leaves the
+        model), or null outside a ListView. */
     function remorseAction(text, action, timeout) {
-        if (!_remorseCache) {
+        var cache = remorse.cache()
+        if (!cache) {
             console.warn("ListItem: remorse needs a ListView")
-            return
+            return null
         }
-        _remorseCache.start(_row, timeout === undefined ? 5000 : timeout, action, text)
+        remorse.countdown = cache.start(remorse.row, timeout === undefined ? 5000 : timeout, action, text || "")
+        return remorse.countdown
     }
-
-    function _showRemorse() {
-        var running = _remorseCache && _remorseCache.running(_row)
-        if (running && !_remorseItem) {
-            _remorseItem = remorseComponent.createObject(item, { "listItem": item, "cache": _remorseCache,
-                                                                 "row": _row, "text": _remorseCache.text(_row) })
-        } else if (!running && _remorseItem) {
-            _remorseItem.destroy()
-            _remorseItem = null
+    QtObject {
+        id: remorse
+        readonly property int row: item.DelegateModel.itemsIndex
+        // The countdown shown; the view's cache deletes it when it ends.
+        property QtObject countdown: null
+        property Item overlay: null
+        function cache() {
+            var view = item.ListView.view
+            return view ? view.RemorseCache : null
+        }
+        function follow() {
+            var running = cache()
+            countdown = running && row >= 0 ? running.at(row) : null
+        }
+        onRowChanged: refollow.restart()
+        Component.onCompleted: follow() // a countdown may be running for this row already
+        onCountdownChanged: {
+            if (overlay)
+                overlay.destroy()
+            overlay = countdown ? remorseComponent.createObject(item, { "countdown": countdown }) : null
         }
     }
-
-    Component.onCompleted: _follow(_remorseCache) // a countdown may be running for this row
-    on_RowChanged: _showRemorse()
-
-    property var _connectedCache: null
-    function _follow(cache) {
-        if (_connectedCache) {
-            _connectedCache.started.disconnect(_showRemorse)
-            _connectedCache.canceled.disconnect(_showRemorse)
-            _connectedCache.countChanged.disconnect(_showRemorse)
-        }
-        _connectedCache = cache
-        if (cache) {
-            cache.started.connect(_showRemorse)
-            cache.canceled.connect(_showRemorse)
-            cache.countChanged.connect(_showRemorse)
-        }
-        _showRemorse()
+    // Once the model's change has reached the cache too: the view may hand its delegates
+    // their new rows first. (A timer goes with the delegate; a deferred call would not.)
+    Timer {
+        id: refollow
+        interval: 0
+        onTriggered: remorse.follow()
     }
-    on_RemorseCacheChanged: _follow(_remorseCache)
-    Component.onDestruction: _follow(null)
-
     Component {
         id: remorseComponent
         RemorseItem {}

@@ -1,42 +1,80 @@
 import QtQuick 2.6
 import Quorvane.Pelkan 1.0
 
-// "Deleting in 5 s, tap to cancel" over a list item, counting down what the view's
-// RemorseCache holds for the row. Made by ListItem.remorseAction(); a tap cancels.
+// "Deleting in 5 s, tap to cancel" over a list row, for as long as its countdown runs.
+// Made by ListItem.remorseAction(), which gives it the countdown the view keeps for the row;
+// a tap (or Space or Enter) cancels the countdown. Opaque, so that the row's own content
+// never shows through.
 MouseArea {
     id: remorse
 
-    property Item listItem
-    property var cache
-    property int row: -1
-    property string text
-    property int secondsLeft: 0
+    /*! The countdown shown: a RemorseCountdown from the view's RemorseCache. */
+    property QtObject countdown: null
+    /*! What will happen ("Deleting"), as given to remorseAction(). */
+    readonly property string text: countdown ? countdown.text : ""
+    /*! Whole seconds left until the action runs. */
+    readonly property int secondsLeft: internal.secondsLeft
+
+    /*! Cancels the countdown: its action does not run. */
+    function cancel() {
+        if (countdown)
+            countdown.cancel()
+    }
 
     anchors.fill: parent
     z: 10
+    visible: countdown !== null && countdown.row >= 0
+    activeFocusOnTab: true
+    onClicked: cancel()
+    Keys.onSpacePressed: cancel()
+    Keys.onReturnPressed: cancel()
+    Keys.onEnterPressed: cancel()
 
-    function refresh() {
-        secondsLeft = cache ? Math.ceil(cache.remaining(row) / 1000) : 0
+    Accessible.role: Accessible.Button
+    Accessible.name: label.text
+    Accessible.onPressAction: cancel()
+
+    QtObject {
+        id: internal
+        property int secondsLeft: 0
+        function refresh() {
+            secondsLeft = remorse.countdown ? Math.ceil(remorse.countdown.remaining() / 1000) : 0
+        }
     }
 
-    onClicked: if (cache) cache.cancel(row)
-    Component.onCompleted: refresh()
+    onCountdownChanged: internal.refresh()
+    Component.onCompleted: internal.refresh()
 
     Timer {
         interval: 200
         repeat: true
-        running: remorse.visible
-        onTriggered: remorse.refresh()
+        running: remorse.visible && remorse.countdown !== null
+        onTriggered: internal.refresh()
     }
 
+    // An opaque ground first: the row's content must not show through the words.
     Rectangle {
-        anchors.fill: parent
+        anchors.fill: remorse
+        color: Theme.rgba(Theme.overlayBackgroundColor, 1)
+    }
+    Rectangle {
+        anchors.fill: remorse
         color: Theme.highlightBackgroundColor
-        opacity: 0.85
+        opacity: 0.3
     }
     Text {
-        anchors { left: parent.left; leftMargin: Theme.horizontalPageMargin; verticalCenter: parent.verticalCenter }
-        text: remorse.text + (remorse.text.length ? " " : "") + qsTr("in %1 s, tap to cancel").arg(remorse.secondsLeft)
+        id: label
+        anchors {
+            left: remorse.left
+            right: remorse.right
+            leftMargin: Theme.horizontalPageMargin
+            rightMargin: Theme.horizontalPageMargin
+            verticalCenter: remorse.verticalCenter
+        }
+        horizontalAlignment: Text.AlignLeft
+        elide: Text.ElideRight
+        text: remorse.text.length ? qsTrId("quorvanepelkan-la-remorse_action").arg(remorse.text).arg(remorse.secondsLeft)
+                                  : qsTrId("quorvanepelkan-la-remorse").arg(remorse.secondsLeft)
         color: Theme.primaryColor
         font.pixelSize: Theme.fontSizeSmall
     }

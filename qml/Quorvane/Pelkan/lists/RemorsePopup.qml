@@ -3,98 +3,133 @@ import Quorvane.Pelkan 1.0
 import Quorvane.Pelkan.private 1.0 as Private
 
 // "Clearing in 5 s, tap to cancel" across the top of a page: execute() starts it, the
-// action runs when the countdown ends, a tap cancels it.
+// action runs when the countdown ends, a tap (or Space or Enter) cancels it.
 MouseArea {
     id: popup
 
+    /*! What will happen ("Clearing"), as given to execute(). */
     property string text
+    /*! Whole seconds left until the action runs. */
     property int secondsLeft: 0
+    /*! True while a countdown runs. */
     readonly property bool active: countdown.running
-    property var _action: null
-    property double _deadline: 0
-    // Where it was declared; while counting down it shows in the window's overlay, over a
-    // frosted view of the page.
-    property Item _home: null
 
+    /*! The countdown ended and its action has run. */
     signal triggered()
+    /*! The countdown was cancelled; its action does not run. */
     signal canceled()
 
-    width: _home ? _home.width : (parent ? parent.width : 0)
-    height: Theme.itemSizeSmall
-    visible: active && (!_home || _home.visible)
-    z: 100
-    Private.OverlayBackground.enabled: _home !== null
-    Private.OverlayBackground.color: Theme.rgba(Theme.highlightBackgroundColor, 0.6)
-
-    onActiveChanged: active ? _raise() : _lower()
-
-    function _raise() {
-        var window = Private.Util.findAncestor(popup, "overlay")
-        if (!window || !window.overlay || _home)
-            return
-        _home = parent
-        var at = _home.mapToItem(window.overlay, 0, 0)
-        parent = window.overlay
-        x = at.x
-        y = at.y
-    }
-
-    function _lower() {
-        if (!_home)
-            return
-        var home = _home
-        _home = null
-        parent = home
-        x = 0
-        y = 0
-    }
-
+    /*! Starts the countdown (restarting one that runs); action runs after timeout ms (5000 if
+        left out) unless cancelled first. */
     function execute(text, action, timeout) {
         popup.text = text || ""
-        _action = action
-        _deadline = Date.now() + (timeout === undefined ? 5000 : timeout)
-        secondsLeft = Math.ceil((_deadline - Date.now()) / 1000)
+        internal.action = action
+        internal.deadline = Date.now() + (timeout === undefined ? 5000 : timeout)
+        secondsLeft = Math.ceil((internal.deadline - Date.now()) / 1000)
         countdown.restart()
     }
 
+    /*! Cancels the running countdown: its action does not run. */
     function cancel() {
         if (!countdown.running)
             return
         countdown.stop()
-        _action = null
+        internal.action = null
         canceled()
     }
 
+    width: internal.home ? internal.home.width : (parent ? parent.width : 0)
+    height: Theme.itemSizeSmall
+    visible: active && (!internal.home || internal.home.visible)
+    z: 100
+    activeFocusOnTab: true
+    Private.OverlayBackground.enabled: internal.home !== null
+    Private.OverlayBackground.color: Theme.rgba(Theme.highlightBackgroundColor, 0.6)
+
+    Accessible.role: Accessible.Button
+    Accessible.name: label.text
+    Accessible.onPressAction: cancel()
+
+    onActiveChanged: active ? internal.raise() : internal.lower()
     onClicked: cancel()
+    Keys.onSpacePressed: cancel()
+    Keys.onReturnPressed: cancel()
+    Keys.onEnterPressed: cancel()
+
+    QtObject {
+        id: internal
+
+        property var action: null
+        property double deadline: 0
+        // Where it was declared; while counting down it shows in the window's overlay, over
+        // a frosted view of the page.
+        property Item home: null
+
+        function raise() {
+            var window = Private.Util.findAncestor(popup, "overlay")
+            if (!window || !window.overlay || home)
+                return
+            home = popup.parent
+            var at = home.mapToItem(window.overlay, 0, 0)
+            popup.parent = window.overlay
+            popup.x = at.x
+            popup.y = at.y
+        }
+
+        function lower() {
+            if (!home)
+                return
+            var declared = home
+            home = null
+            popup.parent = declared
+            popup.x = 0
+            popup.y = 0
+        }
+    }
 
     Timer {
         id: countdown
         interval: 50
         repeat: true
         onTriggered: {
-            var left = popup._deadline - Date.now()
+            var left = internal.deadline - Date.now()
             popup.secondsLeft = Math.ceil(left / 1000)
             if (left > 0)
                 return
             stop()
-            var action = popup._action
-            popup._action = null
+            var action = internal.action
+            internal.action = null
             if (action)
                 action()
             popup.triggered()
         }
     }
 
-    // Outside a window with an overlay, a plain background.
+    // Outside a window with an overlay, a plain opaque background.
     Rectangle {
-        anchors.fill: parent
-        visible: popup._home === null
-        color: Theme.highlightBackgroundColor
-        opacity: 0.9
+        id: plain
+        anchors.fill: popup
+        visible: internal.home === null
+        color: Theme.rgba(Theme.overlayBackgroundColor, 1)
+        Rectangle {
+            anchors.fill: plain
+            color: Theme.highlightBackgroundColor
+            opacity: 0.3
+        }
     }
     Text {
-        anchors { left: parent.left; leftMargin: Theme.horizontalPageMargin; verticalCenter: parent.verticalCenter }
-        text: popup.text + (popup.text.length ? " " : "") + qsTr("in %1 s, tap to cancel").arg(popup.secondsLeft)
+        id: label
+        // By id, not parent: bindings may run again while the popup is torn down.
+        anchors {
+            left: popup.left
+            right: popup.right
+            leftMargin: Theme.horizontalPageMargin
+            rightMargin: Theme.horizontalPageMargin
+            verticalCenter: popup.verticalCenter
+        }
+        elide: Text.ElideRight
+        text: popup.text.length ? qsTrId("quorvanepelkan-la-remorse_action").arg(popup.text).arg(popup.secondsLeft)
+                                : qsTrId("quorvanepelkan-la-remorse").arg(popup.secondsLeft)
         color: Theme.primaryColor
         font.pixelSize: Theme.fontSizeSmall
     }
