@@ -13,6 +13,16 @@
         <extracomment>Button that closes a dialog without accepting it</extracomment>
         <translation>Peruuta</translation>
     </message>
+    <message id="quorvanepelkan-bt-scroll_to_bottom">
+        <source>Scroll to the bottom</source>
+        <extracomment>Accessible name of the button that takes a long list to its end</extracomment>
+        <translation>Vieritä loppuun</translation>
+    </message>
+    <message id="quorvanepelkan-bt-scroll_to_top">
+        <source>Scroll to the top</source>
+        <extracomment>Accessible name of the button that takes a long list to its start</extracomment>
+        <translation>Vieritä alkuun</translation>
+    </message>
     <message id="quorvanepelkan-bytes" numerus="yes">
         <source>%n bytes</source>
         <extracomment>File size in bytes</extracomment>

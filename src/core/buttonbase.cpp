@@ -247,8 +247,10 @@ void ButtonBase::mouseReleaseEvent(QMouseEvent *event)
     if (m_pressKey || event->button() != Qt::LeftButton)
         return;
     ControlBase::mouseReleaseEvent(event);
+    // Inside is what the moves said: a button that moved under a still finger (a row whose
+    // neighbour closed its menu) is still the one pressed.
     setPressPoint(event->localPos());
-    endPress(m_pressed && contains(event->localPos()));
+    endPress(m_pressed);
     event->accept();
 }
 

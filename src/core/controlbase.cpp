@@ -17,6 +17,8 @@ ControlBase::ControlBase(QQuickItem *parent)
 {
     setFlag(ItemIsFocusScope);
     QAccessible::installActivationObserver(this);
+    // Highlighted reads as selected: the current tab, the row whose menu is open.
+    connect(this, &Control::highlightedChanged, this, [this] { setAccessibleState("selected", highlighted()); });
 }
 
 ControlBase::~ControlBase()
@@ -115,6 +117,7 @@ void ControlBase::accessibilityActiveChanged(bool active)
     updateAccessibleName();
     if (m_accessible->description().isEmpty())
         m_accessible->setDescription(m_description);
+    setAccessibleState("selected", highlighted());
     updateAccessibleStates();
 }
 

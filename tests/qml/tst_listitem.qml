@@ -4,17 +4,19 @@ import Quorvane.Pelkan 1.0
 
 // List items with real presses: click, long press opening the context menu below the item
 // and pushing the next rows aside, a tap on a menu item, a press elsewhere closing it, and
-// a swipe over an item dropping its highlight.
+// a swipe over an item dropping its highlight, keys; and the row the theme lays out from its
+// text, description and icon.
 Item {
     id: root
-    width: 400
+    width: 800
     height: 800
 
     property var log: []
 
     ListView {
         id: view
-        anchors.fill: parent
+        width: 400
+        height: parent.height
         model: 5
         delegate: ListItem {
             id: row
@@ -28,6 +30,8 @@ Item {
             Text { text: "Row " + index; anchors.verticalCenter: parent.verticalCenter }
         }
     }
+
+    ListItem { id: themed; x: 400; width: 400 }
 
     TestCase {
         name: "ListItem"
@@ -84,6 +88,58 @@ Item {
             verify(!row(1).highlighted)
             verify(row(1).down)
             mouseRelease(row(1), 100, 10)
+        }
+
+        function test_keys() {
+            row(2).forceActiveFocus()
+            keyClick(Qt.Key_Return)
+            keyClick(Qt.Key_Space)
+            compare(root.log, ["clicked 2", "clicked 2"])
+        }
+
+        // Text at the start (after the icon, where there is one), the description under it,
+        // both in the palette's colours, the highlight ones while the row is highlighted.
+        function test_themedRow_data() {
+            return [
+                { tag: "text", text: "Inbox", height: Theme.itemSizeSmall, x: Theme.horizontalPageMargin },
+                { tag: "text and description", text: "Inbox", description: "3 new", height: Theme.itemSizeMedium,
+                  x: Theme.horizontalPageMargin },
+                { tag: "with an icon", text: "Inbox", icon: "image://theme/icon-m-favorite", height: Theme.itemSizeSmall,
+                  x: Theme.horizontalPageMargin + Theme.iconSizeMedium + Theme.paddingLarge },
+                { tag: "mirrored", text: "Inbox", mirrored: true, height: Theme.itemSizeSmall, right: Theme.horizontalPageMargin },
+            ]
+        }
+
+        function test_themedRow(data) {
+            themed.LayoutMirroring.enabled = !!data.mirrored
+            themed.text = data.text
+            themed.description = data.description || ""
+            themed.iconSource = data.icon || ""
+            compare(themed.height, data.height)
+            var label = findChild(themed, "", function(child) { return child.text === data.text && child.font !== undefined })
+            verify(label, "the text is drawn")
+            var at = label.mapToItem(themed, 0, 0)
+            if (data.right !== undefined)
+                compare(Math.round(themed.width - at.x - label.contentWidth - (label.width - label.contentWidth)), Math.round(data.right))
+            else
+                compare(Math.round(at.x), Math.round(data.x))
+            compare(String(label.color), String(themed.palette.primaryColor))
+            themed.highlighted = true
+            compare(String(label.color), String(themed.palette.highlightColor))
+            themed.highlighted = false
+            themed.LayoutMirroring.enabled = false
+        }
+
+        function findChild(item, unused, matches) {
+            for (var i = 0; i < item.children.length; ++i) {
+                var child = item.children[i]
+                if (matches(child))
+                    return child
+                var found = findChild(child, unused, matches)
+                if (found)
+                    return found
+            }
+            return null
         }
     }
 }

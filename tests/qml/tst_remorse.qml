@@ -116,7 +116,7 @@ Item {
                 verify(Math.abs(countdown.remaining() - left) < 250, countdown.remaining() + " ms left, not " + left)
                 tryCompare(shown, "secondsLeft", Math.ceil(countdown.remaining() / 1000))
                 verify(shown.secondsLeft > 0)
-                compare(shown.Accessible.name, "Deleting in " + shown.secondsLeft + " s, tap to cancel")
+                compare(shown.description, "Deleting in " + shown.secondsLeft + " s, tap to cancel")
                 for (var r = 0; r < 6; ++r)
                     compare(row(r).remorseRunning, r === data.at, "row " + r)
                 if (data.tap)
@@ -174,7 +174,7 @@ Item {
         function test_popup(data) {
             popup.execute("Clearing", function() { root.log.push("cleared") }, 300)
             verify(popup.visible)
-            compare(popup.Accessible.name, "Clearing in 1 s, tap to cancel")
+            compare(popup.description, "Clearing in 1 s, tap to cancel")
             if (data.cancel)
                 mouseClick(popup, 20, 20)
             wait(600)

@@ -4,21 +4,34 @@ import Quorvane.Pelkan 1.0
 import Quorvane.Pelkan.private 1.0 as Private
 import Quorvane.Pelkan.private 1.0 // for the RemorseCache attached to the view
 
-// A row of a list: highlighted while pressed (until a swipe over it begins), clicked on
-// release, and with a `menu` (a ContextMenu, or a component making one) opened below it by
-// a long press or openMenu(), pushing the rows below aside. A press outside closes it.
-Item {
+/*!
+    \qmltype ListItem
+    \inqmlmodule Quorvane.Pelkan
+    \brief A row of a list: `text`, an optional `description` and icon, or content of its own.
+
+    Highlighted while pressed (until a swipe over it begins), clicked on release or by Space,
+    Enter and Return while focused. A long press opens its `menu` (a ContextMenu, or a
+    component making one) below it, pushing the rows below aside; a press outside closes it.
+    With `text` (and `description`, `iconSource`) the row lays itself out as the theme says:
+    the icon at the start, the words beside it in the palette's colours, highlighted while
+    the row is. Declared children are the row's content instead, for rows of their own.
+*/
+Private.ButtonBase {
     id: item
 
-    property real contentHeight: Theme.itemSizeSmall
+    /*! The height of the row itself, without an open menu. */
+    property real contentHeight: description !== "" ? Theme.itemSizeMedium : Theme.itemSizeSmall
+    /*! A ContextMenu opened below the row by a long press or openMenu(), or a component
+        making one. */
     property var menu
+    /*! Whether a long press opens the menu. */
     property bool showMenuOnPressAndHold: true
-    readonly property bool highlighted: (mouseArea.pressed && !detector.dragging) || menuOpen
-    readonly property bool menuOpen: _menuItem !== null && _menuItem.visible
-    readonly property bool down: mouseArea.pressed
-    default property alias content: mouseArea.data
-
-    property Item _menuItem: null
+    /*! A theme icon ("image://theme/icon-m-favorite") or an image URL drawn at the row's start. */
+    property string iconSource
+    /*! True while the menu is open. */
+    readonly property bool menuOpen: internal.menuItem !== null && internal.menuItem.visible
+    /*! What the row holds: declared children go here, sized as the row without its menu. */
+    default property alias content: contentArea.data
 
     // Remorse: a countdown the view keeps for this row, shown over the row while it runs.
     /*! True while a remorse countdown runs for this row. */
@@ -73,66 +86,131 @@ Item {
         RemorseItem {}
     }
 
-    signal clicked()
-    signal pressAndHold()
-
-    width: parent ? parent.width : 0
-    height: contentHeight + (menuOpen ? _menuItem.height : 0)
-
+    /*! Opens the menu below the row and returns it; null without a menu. */
     function openMenu() {
         if (!menu)
             return null
-        if (!_menuItem)
-            _menuItem = menu instanceof Item ? menu : menu.createObject(item)
-        if (!_menuItem)
+        if (!internal.menuItem)
+            internal.menuItem = menu instanceof Item ? menu : menu.createObject(item)
+        if (!internal.menuItem)
             return null
-        _menuItem.parent = item
-        _menuItem.y = Qt.binding(function() { return item.contentHeight })
-        _menuItem.width = Qt.binding(function() { return item.width })
-        _menuItem.visible = true
-        if (!_closer)
-            _closer = closerComponent.createObject(item)
-        return _menuItem
+        internal.menuItem.parent = item
+        internal.menuItem.y = Qt.binding(function() { return item.contentHeight })
+        internal.menuItem.width = Qt.binding(function() { return item.width })
+        internal.menuItem.visible = true
+        if (!internal.closer)
+            internal.closer = closerComponent.createObject(item)
+        return internal.menuItem
     }
 
+    /*! Closes the menu. */
     function closeMenu() {
-        if (_menuItem)
-            _menuItem.visible = false
+        if (internal.menuItem)
+            internal.menuItem.visible = false
     }
 
-    Private.DragDetectorItem {
-        id: detector
+    accessibleRole: Accessible.ListItem
+    width: parent ? parent.width : 0
+    height: contentHeight + (menuOpen ? internal.menuItem.height : 0)
+    highlighted: (down && !internal.swiped) || menuOpen
+
+    onPressed: {
+        internal.pressX = pressX
+        internal.pressY = pressY
+        internal.swiped = false
+    }
+    // A press that turns into a swipe (the page's, or the list's before it scrolls) no
+    // longer shows as a press.
+    onPressXChanged: internal.checkSwipe()
+    onPressYChanged: internal.checkSwipe()
+    onPressAndHold: if (showMenuOnPressAndHold && menu) openMenu()
+    onMenuOpenChanged: {
+        if (!menuOpen && internal.closer) {
+            internal.closer.destroy()
+            internal.closer = null
+        }
+    }
+    onTextChanged: internal.makeLabels()
+    onIconSourceChanged: internal.makeLabels()
+    Component.onCompleted: internal.makeLabels()
+
+    QtObject {
+        id: internal
+
+        property Item menuItem: null
+        // Made while the menu is open only: a thousand rows need not carry one each.
+        property Item closer: null
+        property Item labels: null
+        property real pressX
+        property real pressY
+        property bool swiped: false
+
+        function checkSwipe() {
+            if (item.pressed && !swiped)
+                swiped = Math.abs(item.pressX - pressX) > Qt.styleHints.startDragDistance
+                         || Math.abs(item.pressY - pressY) > Qt.styleHints.startDragDistance
+        }
+        // Rows of their own content never make the theme's layout.
+        function makeLabels() {
+            if (!labels && (item.text !== "" || item.iconSource !== ""))
+                labels = labelsComponent.createObject(contentArea)
+        }
+    }
+
+    // Below the content (declared first); not drawn at all while not highlighted.
+    Rectangle {
         width: item.width
         height: item.contentHeight
+        visible: item.highlighted
+        color: item.palette.highlightBackgroundColor
+        opacity: 0.3
+    }
 
-        MouseArea {
-            id: mouseArea
+    Item {
+        id: contentArea
+        width: item.width
+        height: item.contentHeight
+    }
+
+    Component {
+        id: labelsComponent
+        Item {
             anchors.fill: parent
-            onClicked: item.clicked()
-            onPressAndHold: {
-                item.pressAndHold()
-                if (item.showMenuOnPressAndHold && item.menu)
-                    item.openMenu()
-            }
 
-            // Below the content (declared first); not drawn at all while not highlighted.
-            Rectangle {
-                anchors.fill: parent
-                visible: item.highlighted
-                color: Theme.highlightBackgroundColor
-                opacity: 0.3
+            Image {
+                id: icon
+                anchors { left: parent.left; leftMargin: Theme.horizontalPageMargin; verticalCenter: parent.verticalCenter }
+                width: item.iconSource !== "" ? Theme.iconSizeMedium : 0
+                height: Theme.iconSizeMedium
+                sourceSize: Qt.size(width, height)
+                visible: item.iconSource !== ""
+                source: item.iconSource.indexOf("image://theme/") !== 0 ? item.iconSource
+                      : item.iconSource + (item.iconSource.indexOf("?") < 0 ? "?" : "")
+                        + (item.highlighted ? item.palette.highlightColor : item.palette.primaryColor)
+            }
+            Column {
+                anchors { left: icon.right; leftMargin: item.iconSource !== "" ? Theme.paddingLarge : 0
+                          right: parent.right; rightMargin: Theme.horizontalPageMargin
+                          verticalCenter: parent.verticalCenter }
+                Text {
+                    width: parent.width
+                    text: item.text
+                    color: item.highlighted ? item.palette.highlightColor : item.palette.primaryColor
+                    font.pixelSize: Theme.fontSizeMedium
+                    elide: Text.ElideRight
+                }
+                Text {
+                    width: parent.width
+                    visible: text !== ""
+                    text: item.description
+                    color: item.highlighted ? item.palette.secondaryHighlightColor : item.palette.secondaryColor
+                    font.pixelSize: Theme.fontSizeSmall
+                    elide: Text.ElideRight
+                }
             }
         }
     }
 
-    // Made while the menu is open only: a thousand rows need not carry one each.
-    property Item _closer: null
-    onMenuOpenChanged: {
-        if (!menuOpen && _closer) {
-            _closer.destroy()
-            _closer = null
-        }
-    }
     Component {
         id: closerComponent
         InverseMouseArea {

@@ -35,10 +35,11 @@ Private.QuickScrollButtonBase {
         color: Theme.primaryColor
         font.pixelSize: Theme.fontSizeLarge
     }
-    MouseArea {
+    Private.ButtonBase {
         id: area
         anchors.fill: parent
         enabled: button.active
+        text: internal.up ? qsTrId("quorvanepelkan-bt-scroll_to_top") : qsTrId("quorvanepelkan-bt-scroll_to_bottom")
         onClicked: button.scroll()
     }
 }

@@ -1,17 +1,16 @@
 import QtQuick 2.6
 import Quorvane.Pelkan 1.0
+import Quorvane.Pelkan.private 1.0 as Private
 
 // "Deleting in 5 s, tap to cancel" over a list row, for as long as its countdown runs.
 // Made by ListItem.remorseAction(), which gives it the countdown the view keeps for the row;
 // a tap (or Space or Enter) cancels the countdown. Opaque, so that the row's own content
 // never shows through.
-MouseArea {
+Private.ButtonBase {
     id: remorse
 
     /*! The countdown shown: a RemorseCountdown from the view's RemorseCache. */
     property QtObject countdown: null
-    /*! What will happen ("Deleting"), as given to remorseAction(). */
-    readonly property string text: countdown ? countdown.text : ""
     /*! Whole seconds left until the action runs. */
     readonly property int secondsLeft: internal.secondsLeft
 
@@ -24,15 +23,11 @@ MouseArea {
     anchors.fill: parent
     z: 10
     visible: countdown !== null && countdown.row >= 0
-    activeFocusOnTab: true
+    // What will happen ("Deleting"), as given to remorseAction(); the whole sentence is what a
+    // screen reader reads out as its description.
+    text: countdown ? countdown.text : ""
+    description: label.text
     onClicked: cancel()
-    Keys.onSpacePressed: cancel()
-    Keys.onReturnPressed: cancel()
-    Keys.onEnterPressed: cancel()
-
-    Accessible.role: Accessible.Button
-    Accessible.name: label.text
-    Accessible.onPressAction: cancel()
 
     QtObject {
         id: internal

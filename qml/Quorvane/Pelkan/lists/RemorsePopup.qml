@@ -4,11 +4,9 @@ import Quorvane.Pelkan.private 1.0 as Private
 
 // "Clearing in 5 s, tap to cancel" across the top of a page: execute() starts it, the
 // action runs when the countdown ends, a tap (or Space or Enter) cancels it.
-MouseArea {
+Private.ButtonBase {
     id: popup
 
-    /*! What will happen ("Clearing"), as given to execute(). */
-    property string text
     /*! Whole seconds left until the action runs. */
     property int secondsLeft: 0
     /*! True while a countdown runs. */
@@ -42,19 +40,14 @@ MouseArea {
     height: Theme.itemSizeSmall
     visible: active && (!internal.home || internal.home.visible)
     z: 100
-    activeFocusOnTab: true
+    // text: what will happen ("Clearing"), as given to execute(); the whole sentence is the
+    // description a screen reader reads out.
+    description: label.text
     Private.OverlayBackground.enabled: internal.home !== null
     Private.OverlayBackground.color: Theme.rgba(Theme.highlightBackgroundColor, 0.6)
 
-    Accessible.role: Accessible.Button
-    Accessible.name: label.text
-    Accessible.onPressAction: cancel()
-
     onActiveChanged: active ? internal.raise() : internal.lower()
     onClicked: cancel()
-    Keys.onSpacePressed: cancel()
-    Keys.onReturnPressed: cancel()
-    Keys.onEnterPressed: cancel()
 
     QtObject {
         id: internal

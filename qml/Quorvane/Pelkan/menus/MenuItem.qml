@@ -2,43 +2,44 @@ import QtQuick 2.6
 import Quorvane.Pelkan 1.0
 import Quorvane.Pelkan.private 1.0 as Private
 
-// An entry of a pull-down, push-up or context menu: centred text, highlighted while the
-// finger would pick it (pulley menus pick on release, context menus on a tap). Its menu is
-// the Private.MenuColumn it sits in.
-Text {
+/*!
+    \qmltype MenuItem
+    \inqmlmodule Quorvane.Pelkan
+    \brief An entry of a pull-down, push-up or context menu: its `text`, centred.
+
+    Highlighted while the finger would pick it (pulley menus pick on release, once the
+    content has settled) or while pressed. In a context menu a tap, or Space, Enter and
+    Return while it is focused, picks it: the menu closes and clicked() follows. Its menu is
+    the Private.MenuColumn it sits in.
+*/
+Private.ButtonBase {
     id: item
 
-    /*! Emitted when the item is picked: tapped in a context menu, or let go on in a pulley
-        menu once the content has settled at its edge. */
-    signal clicked()
-    /*! True while the item would run if the finger let go now, or while it is pressed. */
-    readonly property bool highlighted: (internal.menu !== null && internal.menu.highlightedItem === item) || tap.pressed
+    /*! The colour of the text; the palette's highlight colour while highlighted, its primary
+        colour otherwise, until set. */
+    property color color: highlighted ? palette.highlightColor : palette.primaryColor
 
+    accessibleRole: Accessible.MenuItem
     width: parent ? parent.width : 0
     height: Theme.itemSizeSmall * 0.75
-    horizontalAlignment: Text.AlignHCenter
-    verticalAlignment: Text.AlignVCenter
-    color: highlighted ? Theme.highlightColor : Theme.primaryColor
     opacity: enabled ? 1 : 0.4
-    font.pixelSize: Theme.fontSizeMedium
+    highlighted: (internal.menu !== null && internal.menu.highlightedItem === item) || down
 
-    Accessible.role: Accessible.MenuItem
-    Accessible.name: text
-    Accessible.onPressAction: if (enabled) item.clicked()
+    // A menu that picks by a tap hears of it before clicked(), so that it closes first.
+    onReleased: if (internal.menu !== null && internal.menu.tapToPick) internal.menu.picked(item)
 
     QtObject {
         id: internal
         readonly property Private.MenuColumn menu: item.parent instanceof Private.MenuColumn ? item.parent : null
     }
 
-    MouseArea {
-        id: tap
-        anchors.fill: item
-        enabled: internal.menu !== null && internal.menu.tapToPick
-        onPressed: Private.Util.playTouchFeedback()
-        onClicked: {
-            internal.menu.picked(item)
-            item.clicked()
-        }
+    Text {
+        anchors { fill: parent; leftMargin: Theme.paddingMedium; rightMargin: Theme.paddingMedium }
+        horizontalAlignment: Text.AlignHCenter
+        verticalAlignment: Text.AlignVCenter
+        text: item.text
+        color: item.color
+        font.pixelSize: Theme.fontSizeMedium
+        elide: Text.ElideRight
     }
 }

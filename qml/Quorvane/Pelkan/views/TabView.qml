@@ -47,21 +47,20 @@ Item {
         Row {
             Repeater {
                 model: pages.model
-                MouseArea {
+                Private.ButtonBase {
                     id: tab
                     width: bar.tabWidth
                     height: bar.height
+                    text: typeof title !== "undefined" ? title : modelData
+                    accessibleRole: Accessible.PageTab
+                    highlighted: index === pages.currentIndex
                     onClicked: tabs.moveTo(index)
-                    Accessible.role: Accessible.PageTab
-                    Accessible.name: typeof title !== "undefined" ? title : modelData
-                    Accessible.selected: index === pages.currentIndex
-                    Accessible.onPressAction: tabs.moveTo(index)
                     Text {
                         anchors.centerIn: tab
                         width: Math.min(implicitWidth, tab.width - Theme.paddingMedium)
                         elide: Text.ElideRight
-                        text: typeof title !== "undefined" ? title : modelData
-                        color: tab.pressed || index === pages.currentIndex ? Theme.highlightColor : Theme.primaryColor
+                        text: tab.text
+                        color: tab.down || tab.highlighted ? tab.palette.highlightColor : tab.palette.primaryColor
                         font.pixelSize: Theme.fontSizeMedium
                     }
                 }
