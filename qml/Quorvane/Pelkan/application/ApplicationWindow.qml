@@ -55,7 +55,6 @@ Private.Window {
         PageStack {
             id: stack
             anchors.fill: parent
-            _window: window
         }
 
         // Captures only while a popup shows it.
