@@ -81,6 +81,10 @@ Item {
             return stack.push(pageComponent, given, animated ? PageStackAction.Animated : PageStackAction.Immediate)
         }
 
+        function pushKind(kind) {
+            compare(stack.push(kind, { "backNavigation": false }).backNavigation, false, "properties given with the push")
+        }
+
         function settle() {
             tryCompare(stack, "busy", false)
         }
@@ -135,7 +139,8 @@ Item {
                 { tag: "swipe back before half, touch", act: function(s, t) { t.drag("touch", 20, 150) }, depth: 2, top: "B", log: [] },
                 { tag: "a quick flick before half", act: function(s, t) { t.drag("touch", 20, 150, 4) }, depth: 1, top: "A", log: pop },
                 { tag: "a swipe taken away by the system", act: function(s, t) { t.drag("cancel", 20, 300) }, depth: 2, top: "B", log: [] },
-                { tag: "swipe forward", act: function(s, t) { s.pushAttached(pageComponent, { "name": "N" }); t.drag("touch", 380, 100) },
+                { tag: "swipe forward", act: function(s, t) {
+                    s.pushAttached(pageComponent, { "name": "N" }); t.drag("touch", 380, 100) },
                   depth: 3, top: "N", log: forward },
                 // Calls in quick succession, whatever slides: each takes effect, in order.
                 { tag: "pop, and pop again 30 ms later", act: function(s, t) { t.page("C"); s.pop(); t.wait(30); s.pop() },
@@ -162,6 +167,19 @@ Item {
                 { tag: "a push from a page turning Active", act: function(s, t) {
                     t.page("C", true, { "whenActive": function(s) { t.page("D", true) } }) },
                   depth: 4, top: "D", log: push.concat(["C:Deactivating", "D:Activating", "C:Inactive", "D:Active"]) },
+                // Pages of every kind; an item given goes back where it was once popped.
+                { tag: "a URL", act: function(s, t) { t.pushKind(Qt.resolvedUrl("../../qml/Quorvane/Pelkan/pages/Page.qml")) },
+                  depth: 3 },
+                { tag: "a module and name", act: function(s, t) { t.pushKind("Quorvane.Pelkan.Page") }, depth: 3 },
+                { tag: "a module path and name", act: function(s, t) { t.pushKind("Quorvane/Pelkan/Page") }, depth: 3 },
+                { tag: "an item", act: function(s, t) {
+                    var own = pageComponent.createObject(root, { "name": "own" })
+                    t.pushKind(own)
+                    s.pop()
+                    t.settle()
+                    t.compare(own.parent, root)
+                    t.verify(!own.visible)
+                    own.destroy() }, depth: 2, top: "B" },
                 { tag: "a pop from a page turning Active", act: function(s, t) {
                     t.page("C", true, { "whenActive": function(s) { s.pop() } }) },
                   depth: 2, top: "B", log: push.concat(["C:Deactivating", "B:Activating", "C:Inactive", "B:Active"]) },
@@ -235,33 +253,6 @@ Item {
                 compare(stack.currentPage.name, data.depth ? "C" : "B")
             compare(dialog.status, open ? DialogStatus.Opened : DialogStatus.Closed)
             dialog.destroy()
-        }
-
-        function test_pageKinds_data() {
-            return [
-                { tag: "component", page: pageComponent },
-                { tag: "URL", page: Qt.resolvedUrl("../../qml/Quorvane/Pelkan/pages/Page.qml") },
-                { tag: "module and name", page: "Quorvane.Pelkan.Page" },
-                { tag: "module path and name", page: "Quorvane/Pelkan/Page" },
-                { tag: "instance", instance: true },
-            ]
-        }
-
-        function test_pageKinds(data) {
-            var own = data.instance ? pageComponent.createObject(root, { "name": "own" }) : null
-            var page = stack.push(own || data.page, { "backNavigation": false }, PageStackAction.Immediate)
-            verify(page)
-            compare(stack.currentPage, page)
-            compare(page.backNavigation, false, "properties given with the push")
-            compare(stack.find(function(p) { return p.name === "A" }).name, "A")
-            stack.pop(PageStackAction.Immediate)
-            compare(stack.depth, 2)
-            if (own) {
-                // Instances stay the application's: popped, they go back where they were.
-                compare(own.parent, root)
-                verify(!own.visible)
-                own.destroy()
-            }
         }
     }
 }

@@ -76,8 +76,9 @@ void tst_PageStackMessages::messages_data()
     QTest::newRow("pop, animated") << "pageStack.push(page)" << "pageStack.pop()" << 3 << "";
     QTest::newRow("popped with the one below, while sliding")
             << push + ";" + push << "pageStack.pop(); pageStack.pop()" << 3 << "";
-    QTest::newRow("popped past it") << push + ";" + push << "var bottom; pageStack.find(function(p) { bottom = p; return false }); pageStack.pop(bottom)"
-                                    << 3 << "";
+    QTest::newRow("popped past it")
+            << push + ";" + push << "var bottom; pageStack.find(function(p) { bottom = p; return false }); pageStack.pop(bottom)"
+            << 3 << "";
     QTest::newRow("replaced") << push << "pageStack.replace(page); pageStack.pop(PageStackAction.Immediate)" << 3 << "";
     QTest::newRow("attached, then replaced") << "pageStack.pushAttached(page)" << "pageStack.pushAttached(page)" << 3 << "";
 
