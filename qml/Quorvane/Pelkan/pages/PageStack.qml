@@ -387,7 +387,7 @@ PageStackBase {
                     settle += direction * extent
             }
             move = next
-            if (slides)
+            if (slides && settle !== 0)
                 stack._ongoingTransitionCount = 1
             place()
             if (next.from !== next.to) {
