@@ -4,14 +4,15 @@ import QtTest 1.2
 import Quorvane.Pelkan 1.0
 import PelkanTest 1.0
 
-// The page stack through its public surface: swipes with real mouse and touch events,
-// page statuses for every kind of move, and dialogs.
+// The page stack through its public surface: moves made by calls and by swipes (real mouse
+// and touch events), alone and in quick succession, the statuses they leave, and dialogs.
 Item {
     id: root
     width: 400
     height: 600
 
     property var log: []
+    property var faults: []
     property double now: 0 // the stack's clock
 
     ApplicationWindow {
@@ -23,7 +24,17 @@ Item {
         id: pageComponent
         Page {
             property string name
-            onStatusChanged: root.log.push(name + ":" + ["Inactive", "Activating", "Active", "Deactivating"][status])
+            property int last: PageStatus.Inactive
+            onStatusChanged: {
+                root.log.push(name + ":" + ["Inactive", "Activating", "Active", "Deactivating"][status])
+                // Each move: Inactive, Activating, Active, Deactivating, Inactive, in turn; a
+                // move ends only once nothing slides.
+                if (status !== (last + 1) % 4)
+                    root.faults.push(name + ": " + last + " to " + status)
+                if ((status === PageStatus.Active || status === PageStatus.Inactive) && app.pageStack.busy)
+                    root.faults.push(name + ": " + status + " while busy")
+                last = status
+            }
             MouseArea { anchors.fill: parent } // content that takes presses, as a list does
         }
     }
@@ -32,8 +43,11 @@ Item {
         id: dialogComponent
         Dialog {
             property var outcome: []
+            onOpened: outcome.push("opened")
             onAccepted: outcome.push("accepted")
             onRejected: outcome.push("rejected")
+            property var then: null
+            onDone: if (then) then()
             DialogHeader { id: header }
             property alias header: header
         }
@@ -46,24 +60,35 @@ Item {
         readonly property Item stack: app.pageStack
 
         function init() {
-            stack._now = function() { return root.now }
+            stack.clock = function() { return root.now }
             stack.clear()
-            stack.push(pageComponent, { "name": "A" }, PageStackAction.Immediate)
-            stack.push(pageComponent, { "name": "B" }, PageStackAction.Immediate)
+            page("A")
+            page("B")
             compare(stack.depth, 2)
             root.log = []
+            root.faults = []
+        }
+
+        function page(name, animated, properties) {
+            var given = properties || {}
+            given.name = name
+            return stack.push(pageComponent, given, animated ? PageStackAction.Animated : PageStackAction.Immediate)
+        }
+
+        function pushKind(kind) {
+            compare(stack.push(kind, { "backNavigation": false }).backNavigation, false, "properties given with the push")
         }
 
         function settle() {
             tryCompare(stack, "busy", false)
         }
 
-        // A finger (or the mouse) from one x to another at mid-height in a dozen moves;
-        // the callback sees the stack between the last move and the release.
-        function drag(input, fromX, toX, beforeRelease, msPerMove) {
+        // A finger (or the mouse) from one x to another at mid-height in a dozen moves, the
+        // pages following it; "cancel" ends in the system taking the touch away.
+        function drag(input, fromX, toX, msPerMove) {
             var y = 300
             var steps = 12
-            var touch = input === "touch" ? touchEvent(stack) : null
+            var touch = input !== "mouse" ? touchEvent(stack) : null
             if (touch)
                 touch.press(0, stack, fromX, y).commit()
             else
@@ -76,87 +101,121 @@ Item {
                 else
                     mouseMove(stack, x, y)
             }
-            if (beforeRelease)
-                beforeRelease()
+            var moved = stack._leftFlickDifference - stack._rightFlickDifference
+            verify(moved !== 0)
+            compare(stack.currentPage.x, moved)
+            var beside = moved > 0 ? stack.previousPage : stack.nextPage
+            if (beside)
+                compare(beside.x, moved > 0 ? moved - stack.width : moved + stack.width)
             if (input === "cancel")
-                return
-            if (touch)
+                TouchSystem.cancel(root.Window.window)
+            else if (touch)
                 touch.release(0, stack, toX, y).commit()
             else
                 mouseRelease(stack, toX, y)
         }
 
-        function test_swipe_data() {
-            return [
-                { tag: "mouse, back past half", input: "mouse", to: 300, depth: 1, top: "A" },
-                { tag: "mouse, back before half", input: "mouse", to: 150, depth: 2, top: "B" },
-                { tag: "touch, back past half", input: "touch", to: 300, depth: 1, top: "A" },
-                { tag: "touch, back before half", input: "touch", to: 150, depth: 2, top: "B" },
-                { tag: "touch, a quick flick before half", input: "touch", to: 150, pace: 4, depth: 1, top: "A" },
-                { tag: "touch, taken away by the system", input: "cancel", to: 300, depth: 2, top: "B" },
-            ]
-        }
-
-        function test_swipe(data) {
-            var page = stack.currentPage
-            drag(data.input === "cancel" ? "touch" : data.input, 20, data.to, function() {
-                // The page follows the finger, the one below comes in from the left.
-                verify(stack._leftFlickDifference > 0)
-                compare(page.parent.x, stack._leftFlickDifference)
-                compare(stack.previousPage.parent.x, stack._leftFlickDifference - stack.width)
-                if (data.input === "cancel")
-                    TouchSystem.cancel(root.Window.window)
-            }, data.pace)
-            settle()
-            compare(stack.depth, data.depth)
-            compare(stack.currentPage.name, data.top)
-            compare(stack.currentPage.parent.x, 0)
-        }
-
-        function test_status_data() {
-            // What happens, and the statuses it leaves in the log, in order.
+        function test_move_data() {
+            // What happens; the depth and top page it leaves, and the statuses it logs.
             var push = ["B:Deactivating", "C:Activating", "B:Inactive", "C:Active"]
             var pop = ["B:Deactivating", "A:Activating", "B:Inactive", "A:Active"]
             var forward = ["B:Deactivating", "N:Activating", "B:Inactive", "N:Active"]
+            var named = function(name) { return function(p) { return p.name === name } }
             return [
-                { tag: "push, animated", act: function(s) { s.push(pageComponent, { "name": "C" }) }, log: push },
-                { tag: "push, immediate", act: function(s) { s.push(pageComponent, { "name": "C" }, PageStackAction.Immediate) }, log: push },
-                { tag: "pop, animated", act: function(s) { s.pop() }, log: pop },
-                { tag: "pop, immediate", act: function(s) { s.pop(PageStackAction.Immediate) }, log: pop },
-                { tag: "replace", act: function(s) { s.replace(pageComponent, { "name": "C" }) }, log: push },
-                { tag: "swipe back", act: function(s, t) { t.drag("mouse", 20, 300) }, log: pop },
-                { tag: "navigate forward", act: function(s) {
-                    s.pushAttached(pageComponent, { "name": "N" }); s.navigateForward() }, log: forward },
+                { tag: "push, animated", act: function(s, t) { t.page("C", true) }, depth: 3, top: "C", log: push },
+                { tag: "push, immediate", act: function(s, t) { t.page("C") }, depth: 3, top: "C", log: push },
+                { tag: "pop, animated", act: function(s) { s.pop() }, depth: 1, top: "A", log: pop },
+                { tag: "pop, immediate", act: function(s) { s.pop(PageStackAction.Immediate) }, depth: 1, top: "A", log: pop },
+                { tag: "replace", act: function(s) { s.replace(pageComponent, { "name": "C" }) }, depth: 2, top: "C", log: push },
+                { tag: "navigate forward", act: function(s) { s.pushAttached(pageComponent, { "name": "N" }); s.navigateForward() },
+                  depth: 3, top: "N", log: forward },
+                { tag: "swipe back past half, mouse", act: function(s, t) { t.drag("mouse", 20, 300) }, depth: 1, top: "A", log: pop },
+                { tag: "swipe back before half, touch", act: function(s, t) { t.drag("touch", 20, 150) }, depth: 2, top: "B", log: [] },
+                { tag: "a quick flick before half", act: function(s, t) { t.drag("touch", 20, 150, 4) }, depth: 1, top: "A", log: pop },
+                { tag: "a swipe taken away by the system", act: function(s, t) { t.drag("cancel", 20, 300) }, depth: 2, top: "B", log: [] },
                 { tag: "swipe forward", act: function(s, t) {
-                    s.pushAttached(pageComponent, { "name": "N" }); t.drag("touch", 380, 100) }, log: forward },
+                    s.pushAttached(pageComponent, { "name": "N" }); t.drag("touch", 380, 100) },
+                  depth: 3, top: "N", log: forward },
+                // Calls in quick succession, whatever slides: each takes effect, in order.
+                { tag: "pop, and pop again 30 ms later", act: function(s, t) { t.page("C"); s.pop(); t.wait(30); s.pop() },
+                  depth: 1, top: "A" },
+                { tag: "twenty pages popped 50 ms apart", act: function(s, t) {
+                    for (var i = 3; i <= 20; ++i)
+                        t.page("P" + i)
+                    for (var j = 1; j < 20; ++j) {
+                        s.pop()
+                        t.wait(50)
+                    } }, depth: 1, top: "A" },
+                { tag: "a push while a pop slides", act: function(s, t) { s.pop(); t.wait(30); t.page("C", true) },
+                  depth: 2, top: "C", log: pop.concat(["A:Deactivating", "C:Activating", "A:Inactive", "C:Active"]) },
+                { tag: "clear and push while a push slides", act: function(s, t) { t.page("C", true); s.clear(); t.page("D", true) },
+                  depth: 1, top: "D", log: push.concat(["C:Deactivating", "C:Inactive", "D:Activating", "D:Active"]) },
+                { tag: "attach and go forward while a pop slides", act: function(s, t) {
+                    s.pop(); t.wait(30); s.pushAttached(pageComponent, { "name": "N" }); s.navigateForward() }, depth: 2, top: "N" },
+                { tag: "a pop while a released finger settles", act: function(s, t) { t.drag("touch", 20, 150); s.pop() },
+                  depth: 1, top: "A", log: pop },
+                { tag: "a swipe while a pop slides", act: function(s, t) { t.page("C"); s.pop(); t.drag("mouse", 20, 300) },
+                  depth: 1, top: "A" },
+                { tag: "a pop while a swiped page slides away", act: function(s, t) { t.page("C"); t.drag("mouse", 20, 300); s.pop() },
+                  depth: 1, top: "A" },
+                // Pages of every kind; an item given goes back where it was once popped.
+                { tag: "a URL", act: function(s, t) { t.pushKind(Qt.resolvedUrl("../../qml/Quorvane/Pelkan/pages/Page.qml")) },
+                  depth: 3 },
+                { tag: "a module and name", act: function(s, t) { t.pushKind("Quorvane.Pelkan.Page") }, depth: 3 },
+                { tag: "a module path and name", act: function(s, t) { t.pushKind("Quorvane/Pelkan/Page") }, depth: 3 },
+                { tag: "an item", act: function(s, t) {
+                    var own = pageComponent.createObject(root, { "name": "own" })
+                    t.pushKind(own)
+                    s.pop()
+                    t.settle()
+                    t.compare(own.parent, root)
+                    t.verify(!own.visible)
+                    own.destroy() }, depth: 2, top: "B" },
             ]
         }
 
-        function test_status(data) {
+        function test_move(data) {
             data.act(stack, this)
             settle()
-            compare(root.log, data.log)
-        }
-
-        function test_backKeyPopsOnlyOnTheDevice() {
-            // The Back key belongs to the device's compositor; elsewhere it does nothing.
-            stack.forceActiveFocus()
-            keyClick(Qt.Key_Back)
-            settle()
-            compare(stack.depth, 2)
+            compare(root.faults, [])
+            if (data.log)
+                compare(root.log, data.log)
+            compare(stack.depth, data.depth)
+            compare(stack.currentPage.name, data.top)
+            compare(stack.currentPage.status, PageStatus.Active)
+            compare(stack.currentPage.x, 0)
+            // At rest, only the top page shows; those below wait, Inactive.
+            stack.find(function(p) {
+                if (p !== stack.currentPage)
+                    verify(!p.visible && p.status === PageStatus.Inactive, p.name)
+                return false
+            })
         }
 
         function test_dialog_data() {
+            var accepted = ["opened", "accepted"]
+            var rejected = ["opened", "rejected"]
             return [
-                { tag: "accept button", act: function(d, t) { t.mouseClick(d.header, d.width - 20, 20) }, result: DialogResult.Accepted },
-                { tag: "cancel button", act: function(d, t) { t.mouseClick(d.header, 20, 20) }, result: DialogResult.Rejected },
-                { tag: "accept()", act: function(d) { d.accept() }, result: DialogResult.Accepted },
-                { tag: "reject()", act: function(d) { d.reject() }, result: DialogResult.Rejected },
-                { tag: "swipe forward", act: function(d, t) { t.drag("touch", 380, 60) }, result: DialogResult.Accepted },
-                { tag: "swipe back", act: function(d, t) { t.drag("mouse", 20, 340) }, result: DialogResult.Rejected },
-                { tag: "accept() while it cannot", cannot: true, act: function(d) { d.accept() }, result: DialogResult.None },
+                { tag: "accept button", act: function(d, t) { t.mouseClick(d.header, d.width - 20, 20) }, outcome: accepted },
+                { tag: "cancel button", act: function(d, t) { t.mouseClick(d.header, 20, 20) }, outcome: rejected },
+                { tag: "accept()", act: function(d) { d.accept() }, outcome: accepted },
+                { tag: "reject()", act: function(d) { d.reject() }, outcome: rejected },
+                { tag: "swipe forward", act: function(d, t) { t.drag("touch", 380, 60) }, outcome: accepted },
+                { tag: "swipe back", act: function(d, t) { t.drag("mouse", 20, 340) }, outcome: rejected },
+                { tag: "accept() while it cannot", cannot: true, act: function(d) { d.accept() }, outcome: ["opened"] },
                 { tag: "accept button while it cannot", cannot: true,
-                  act: function(d, t) { t.mouseClick(d.header, d.width - 20, 20) }, result: DialogResult.None },
+                  act: function(d, t) { t.mouseClick(d.header, d.width - 20, 20) }, outcome: ["opened"] },
+                // Decided while it slides in: it opens first.
+                { tag: "accept() while it opens", early: true, act: function(d) { d.accept() }, outcome: accepted },
+                { tag: "reject(), and open again at once", act: function(d) { d.reject(); d.open() },
+                  outcome: ["opened", "rejected", "opened"] },
+                { tag: "reject(), and a push at once", act: function(d, t) { d.reject(); t.page("C", true) },
+                  outcome: rejected, depth: 3 },
+                // A page pushed from the outcome's handler comes on top of the page below.
+                { tag: "accept(), a page pushed when done", act: function(d, t) {
+                    d.then = function() { t.page("C", true) }; d.accept() }, outcome: accepted, depth: 3 },
+                { tag: "swipe back, a page pushed when done", act: function(d, t) {
+                    d.then = function() { t.page("C", true) }; t.drag("mouse", 20, 340) }, outcome: rejected, depth: 3 },
             ]
         }
 
@@ -164,44 +223,24 @@ Item {
             var dialog = dialogComponent.createObject(stack.currentPage) // declared in a page, as usual
             dialog.canAccept = !data.cannot
             dialog.open()
-            settle()
-            compare(stack.currentPage, dialog)
-            compare(dialog.status, DialogStatus.Opened)
+            if (!data.early) {
+                settle()
+                compare(stack.currentPage, dialog)
+                compare(dialog.status, DialogStatus.Opened)
+            }
             data.act(dialog, this)
             settle()
-            compare(dialog.result, data.result)
-            var expected = data.result === DialogResult.None ? [] : [data.result === DialogResult.Accepted ? "accepted" : "rejected"]
-            compare(dialog.outcome, expected)
-            compare(stack.depth, data.result === DialogResult.None ? 3 : 2)
-            compare(dialog.status, data.result === DialogResult.None ? DialogStatus.Opened : DialogStatus.Closed)
+            var open = data.outcome[data.outcome.length - 1] === "opened"
+            compare(dialog.outcome, data.outcome)
+            compare(dialog.result, open ? DialogResult.None
+                                        : data.outcome[1] === "accepted" ? DialogResult.Accepted : DialogResult.Rejected)
+            compare(dialog.visible, open)
+            compare(root.faults, [])
+            compare(stack.depth, data.depth || (open ? 3 : 2))
+            if (!open)
+                compare(stack.currentPage.name, data.depth ? "C" : "B")
+            compare(dialog.status, open ? DialogStatus.Opened : DialogStatus.Closed)
             dialog.destroy()
-        }
-
-        function test_pageKinds_data() {
-            return [
-                { tag: "component", page: pageComponent },
-                { tag: "URL", page: Qt.resolvedUrl("../../qml/Quorvane/Pelkan/pages/Page.qml") },
-                { tag: "module and name", page: "Quorvane.Pelkan.Page" },
-                { tag: "module path and name", page: "Quorvane/Pelkan/Page" },
-                { tag: "instance", instance: true },
-            ]
-        }
-
-        function test_pageKinds(data) {
-            var own = data.instance ? pageComponent.createObject(root, { "name": "own" }) : null
-            var page = stack.push(own || data.page, { "backNavigation": false }, PageStackAction.Immediate)
-            verify(page)
-            compare(stack.currentPage, page)
-            compare(page.backNavigation, false, "properties given with the push")
-            compare(stack.find(function(p) { return p.name === "A" }).name, "A")
-            stack.pop(PageStackAction.Immediate)
-            compare(stack.depth, 2)
-            if (own) {
-                // Instances stay the application's: popped, they go back where they were.
-                compare(own.parent, root)
-                verify(!own.visible)
-                own.destroy()
-            }
         }
     }
 }
