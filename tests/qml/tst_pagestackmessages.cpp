@@ -16,8 +16,8 @@ void collect(QtMsgType type, const QMessageLogContext &, const QString &text)
         collected->append(text);
 }
 
-// A page as applications write them: a form, tabs and a 40-row list of the toolkit's own
-// components, and content that reads its parent.
+// A page as applications write them: a form, tabs, a slideshow and a 40-row list of the
+// toolkit's own components, and content that reads its parent.
 const QByteArray Document = R"(
 import QtQuick 2.6
 import Quorvane.Pelkan 1.0
@@ -29,7 +29,8 @@ ApplicationWindow {
             Column {
                 id: form
                 anchors { left: parent.left; right: parent.right }
-                TextField { width: parent.width; label: "Name" }
+                TextField { width: parent.width; label: "Name"; text: "a text longer than the field is wide, so that it scrolls" }
+                SearchField {} TextArea { label: "Notes" } PasswordField {}
                 TextSwitch { text: "Switch" }
                 Slider { width: parent.width; label: "Volume"; maximumValue: 10 }
                 ComboBox { width: parent.width; label: "Colour"; model: ["Red", "Green"] }
@@ -42,6 +43,7 @@ ApplicationWindow {
                 model: ["One", "Two"]
                 delegate: Item { Label { anchors.centerIn: parent; text: modelData } }
             }
+            SlideshowView { anchors.fill: tabs; model: 3; delegate: Item {} }
             ListView {
                 anchors { top: tabs.bottom; left: parent.left; right: parent.right }
                 height: 40 * Theme.itemSizeSmall
