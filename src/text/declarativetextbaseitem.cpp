@@ -39,6 +39,9 @@ DeclarativeTextBaseItem::DeclarativeTextBaseItem(QQuickItem *parent)
     themePaddings();
     connect(Pelkan::Theme::instance(), &Pelkan::Theme::pixelRatioChanged, this, &DeclarativeTextBaseItem::themePaddings);
     setActiveFocusOnTab(false);
+    // Focus given to the field (forceActiveFocus() on it, or a page that gets the focus back)
+    // reaches its editor.
+    setFlag(ItemIsFocusScope);
     connect(m_underline, &DeclarativeUnderline::lineWidthChanged, this, &QQuickItem::polish);
     connect(m_underline, &DeclarativeUnderline::focusLineWidthChanged, this, &QQuickItem::polish);
 }
