@@ -11,8 +11,32 @@ class tst_Clipboard : public QObject
     Q_OBJECT
 
 private Q_SLOTS:
-    void clipboard();
+    void clipboard()
+    {
+        QGuiApplication::clipboard()->clear();
+        QObject *clipboard = singleton("Clipboard");
+        QVERIFY(clipboard);
+        QTRY_VERIFY(!clipboard->property("hasText").toBool());
+        QSignalSpy text(clipboard, SIGNAL(textChanged()));
+        QSignalSpy hasText(clipboard, SIGNAL(hasTextChanged()));
 
+        // Another writer is seen.
+        QGuiApplication::clipboard()->setText(QStringLiteral("copied"));
+        QTRY_COMPARE(clipboard->property("text").toString(), QStringLiteral("copied"));
+        QVERIFY(clipboard->property("hasText").toBool());
+        QCOMPARE(text.count(), 1);
+        QCOMPARE(hasText.count(), 1);
+
+        // Writing from QML reaches the system clipboard.
+        QVERIFY(clipboard->setProperty("text", QStringLiteral("pasted")));
+        QTRY_COMPARE(QGuiApplication::clipboard()->text(), QStringLiteral("pasted"));
+        QTRY_COMPARE(text.count(), 2);
+        QCOMPARE(hasText.count(), 1);
+
+        QVERIFY(clipboard->setProperty("text", QString()));
+        QTRY_VERIFY(!clipboard->property("hasText").toBool());
+        QCOMPARE(hasText.count(), 2);
+    }
 private:
     QObject *singleton(const char *name);
     QQmlEngine m_engine;
@@ -30,33 +54,6 @@ QObject *tst_Clipboard::singleton(const char *name)
     }
     root->setParent(&m_engine);
     return root->property("it").value<QObject *>();
-}
-
-void tst_Clipboard::clipboard()
-{
-    QGuiApplication::clipboard()->clear();
-    QObject *clipboard = singleton("Clipboard");
-    QVERIFY(clipboard);
-    QTRY_VERIFY(!clipboard->property("hasText").toBool());
-    QSignalSpy text(clipboard, SIGNAL(textChanged()));
-    QSignalSpy hasText(clipboard, SIGNAL(hasTextChanged()));
-
-    // Another writer is seen.
-    QGuiApplication::clipboard()->setText(QStringLiteral("copied"));
-    QTRY_COMPARE(clipboard->property("text").toString(), QStringLiteral("copied"));
-    QVERIFY(clipboard->property("hasText").toBool());
-    QCOMPARE(text.count(), 1);
-    QCOMPARE(hasText.count(), 1);
-
-    // Writing from QML reaches the system clipboard.
-    QVERIFY(clipboard->setProperty("text", QStringLiteral("pasted")));
-    QTRY_COMPARE(QGuiApplication::clipboard()->text(), QStringLiteral("pasted"));
-    QTRY_COMPARE(text.count(), 2);
-    QCOMPARE(hasText.count(), 1);
-
-    QVERIFY(clipboard->setProperty("text", QString()));
-    QTRY_VERIFY(!clipboard->property("hasText").toBool());
-    QCOMPARE(hasText.count(), 2);
 }
 
 QTEST_MAIN(tst_Clipboard)
