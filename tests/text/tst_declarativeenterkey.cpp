@@ -12,10 +12,7 @@ class tst_DeclarativeEnterKey : public QObject
     Q_OBJECT
 
 private Q_SLOTS:
-    void cleanup()
-    {
-        m_window.reset();
-    }
+    void cleanup() { m_window.reset(); }
 
     void plainItemWarnsAndKeepsDefaults()
     {

@@ -39,10 +39,7 @@ private Q_SLOTS:
         useCatalogue(true);
     }
 
-    void cleanupTestCase()
-    {
-        ConfigFixture::reset(HourModeKey);
-    }
+    void cleanupTestCase() { ConfigFixture::reset(HourModeKey); }
 
     void formatDate_data()
     {

@@ -1,8 +1,8 @@
-// A caller that connects to the bus as an ordinary user and presses cover action 0, at once
-// or after making the process behind its connection look privileged, the two ways an
-// attacker would.
+// A caller that presses a cover action at once (plain, action <index>, default 0), or
+// connects as an ordinary user and presses action 0 after making the process behind its
+// connection look privileged, the two ways an attacker would.
 //
-//   forgedcaller plain    <bus> <service> <path> <result-file>
+//   forgedcaller plain    <bus> <service> <path> <result-file> [index]
 //   forgedcaller setuid   <bus> <service> <path> <result-file> <blocking set-uid program>
 //       Forks. The parent executes the set-uid program; the child waits until its parent's
 //       /proc entry is root's and calls.
@@ -45,10 +45,9 @@ bool waitForRootOwner(pid_t pid)
     return false;
 }
 
-std::string pressAction(DBusConnection *connection, const char *service, const char *path)
+std::string pressAction(DBusConnection *connection, const char *service, const char *path, dbus_int32_t index = 0)
 {
     DBusMessage *call = dbus_message_new_method_call(service, path, "org.quorvaneos.pelkan.coveraction", "trigger");
-    dbus_int32_t index = 0;
     dbus_message_append_args(call, DBUS_TYPE_INT32, &index, DBUS_TYPE_INVALID);
     DBusError error;
     dbus_error_init(&error);
@@ -69,9 +68,9 @@ int main(int argc, char **argv)
 {
     const bool setuid = argc == 7 && std::strcmp(argv[1], "setuid") == 0;
     const bool reuse = argc == 6 && std::strcmp(argv[1], "pidreuse") == 0;
-    const bool plain = argc == 6 && std::strcmp(argv[1], "plain") == 0;
+    const bool plain = (argc == 6 || argc == 7) && std::strcmp(argv[1], "plain") == 0;
     if (!setuid && !reuse && !plain) {
-        std::fprintf(stderr, "usage: %s plain|setuid|pidreuse bus service path result-file [program]\n", argv[0]);
+        std::fprintf(stderr, "usage: %s plain|setuid|pidreuse bus service path result-file [index|program]\n", argv[0]);
         return 2;
     }
     DBusError error;
@@ -83,7 +82,7 @@ int main(int argc, char **argv)
     }
     const std::string result = argv[5];
     if (plain) {
-        writeFile(result, pressAction(connection, argv[3], argv[4]));
+        writeFile(result, pressAction(connection, argv[3], argv[4], argc == 7 ? std::atoi(argv[6]) : 0));
         return 0;
     }
     const pid_t opener = ::getpid();

@@ -21,20 +21,10 @@
 // A private bus that, unlike an ordinary session bus, admits every user: the caller check
 // is tested against a second process running under another uid.
 static const char BusConfig[] =
-        "<!DOCTYPE busconfig PUBLIC \"-//freedesktop//DTD D-Bus Bus Configuration 1.0//EN\"\n"
-        " \"http://www.freedesktop.org/standards/dbus/1.0/busconfig.dtd\">\n"
-        "<busconfig>\n"
-        "  <type>session</type>\n"
-        "  <listen>unix:path=%1</listen>\n"
-        "  <auth>EXTERNAL</auth>\n"
-        "  <policy context=\"default\">\n"
-        "    <allow user=\"*\"/>\n"
-        "    <allow send_destination=\"*\" eavesdrop=\"true\"/>\n"
-        "    <allow eavesdrop=\"true\"/>\n"
-        "    <allow own=\"*\"/>\n"
-        "  </policy>\n"
-        "  <limit name=\"max_names_per_connection\">40</limit>\n"
-        "</busconfig>\n";
+        "<busconfig><type>session</type><listen>unix:path=%1</listen><auth>EXTERNAL</auth>"
+        "<policy context=\"default\"><allow user=\"*\"/><allow send_destination=\"*\" eavesdrop=\"true\"/>"
+        "<allow eavesdrop=\"true\"/><allow own=\"*\"/></policy>"
+        "<limit name=\"max_names_per_connection\">40</limit></busconfig>\n";
 
 // A root process that takes the given pid, as a later process would when pids wrap round.
 static pid_t startRootProcessWithPid(pid_t pid)
@@ -55,10 +45,7 @@ static pid_t startRootProcessWithPid(pid_t pid)
 
 namespace {
 QStringList s_messages;
-void collectMessages(QtMsgType, const QMessageLogContext &, const QString &text)
-{
-    s_messages << text;
-}
+void collectMessages(QtMsgType, const QMessageLogContext &, const QString &text) { s_messages << text; }
 } // namespace
 
 class tst_DeclarativeCoverActionList : public QObject
@@ -130,66 +117,36 @@ private Q_SLOTS:
         QDBusConnection::disconnectFromBus(QStringLiteral("late caller"));
     }
 
-    void triggerFromPrivilegedCaller_data()
-    {
-        QTest::addColumn<int>("index");
-        QTest::addColumn<int>("triggered"); // which action fires, -1 for none
-        QTest::newRow("first") << 0 << 0;
-        QTest::newRow("third") << 2 << 2;
-        QTest::newRow("past the end") << 3 << -1;
-        QTest::newRow("negative") << -1 << -1;
-    }
-
-    void triggerFromPrivilegedCaller()
-    {
-        if (::getuid() != 0)
-            QSKIP("the caller check accepts root; this test runs as root in CI");
-        QFETCH(int, index);
-        QFETCH(int, triggered);
-        DeclarativeCoverActionList *list = makeList(3);
-        QList<QSharedPointer<QSignalSpy>> spies;
-        for (DeclarativeCoverAction *action : list->actionList())
-            spies << QSharedPointer<QSignalSpy>::create(action, &DeclarativeCoverAction::triggered);
-
-        // A connection of its own, as the home screen would have.
-        QDBusConnection caller = QDBusConnection::connectToBus(m_address, QStringLiteral("caller"));
-        QVERIFY(caller.isConnected());
-        if (triggered < 0)
-            QTest::ignoreMessage(QtWarningMsg, QRegularExpression(QStringLiteral("^CoverActionList: no action at index")));
-        QDBusMessage call = QDBusMessage::createMethodCall(list->serviceName(), list->objectPath(),
-                                                          QStringLiteral("org.quorvaneos.pelkan.coveraction"),
-                                                          QStringLiteral("trigger"));
-        call << index;
-        QDBusPendingCall pending = caller.asyncCall(call);
-        QTRY_VERIFY(pending.isFinished());
-        QVERIFY2(!pending.isError(), qPrintable(pending.error().message()));
-        for (int i = 0; i < spies.size(); ++i)
-            QCOMPARE(spies.at(i)->count(), i == triggered ? 1 : 0);
-        QDBusConnection::disconnectFromBus(QStringLiteral("caller"));
-    }
-
-    void callerUnderAnotherUser_data()
+    void callers_data()
     {
         QTest::addColumn<QString>("mode");
-        QTest::addColumn<QString>("group");
-        QTest::newRow("another user") << "plain" << "nogroup";
-        QTest::newRow("another user in the privileged group: accepted") << "plain" << "privileged";
-        QTest::newRow("connection handed to a child, parent runs a set-uid program") << "setuid" << "nogroup";
-        QTest::newRow("connection kept by a child, a root process reuses the pid") << "pidreuse" << "nogroup";
+        QTest::addColumn<QString>("group"); // empty: the caller runs as root
+        QTest::addColumn<int>("index");
+        QTest::addColumn<int>("triggered"); // which of three actions fires, -1 for none
+        QTest::newRow("root, first") << "plain" << "" << 0 << 0;
+        QTest::newRow("root, third") << "plain" << "" << 2 << 2;
+        QTest::newRow("root, past the end") << "plain" << "" << 3 << -1;
+        QTest::newRow("root, negative") << "plain" << "" << -1 << -1;
+        QTest::newRow("another user") << "plain" << "nogroup" << 0 << -1;
+        QTest::newRow("another user in the privileged group") << "plain" << "privileged" << 0 << 0;
+        QTest::newRow("connection handed to a child, parent runs a set-uid program") << "setuid" << "nogroup" << 0 << -1;
+        QTest::newRow("connection kept by a child, a root process reuses the pid") << "pidreuse" << "nogroup" << 0 << -1;
     }
 
-    // Only a caller in the privileged group may press, also when the process behind a
-    // connection made as another user is made to look privileged afterwards.
-    void callerUnderAnotherUser()
+    // Only root or a caller in the privileged group may press, also when the process behind
+    // a connection made as another user is made to look privileged afterwards.
+    void callers()
     {
         QFETCH(QString, mode);
         QFETCH(QString, group);
+        QFETCH(int, index);
+        QFETCH(int, triggered);
         if (::getuid() != 0)
-            QSKIP("running a caller under another uid needs root");
+            QSKIP("running callers as root and under another uid needs root");
         if (group == QLatin1String("privileged") && QProcess::execute(QStringLiteral("groupadd"), { QStringLiteral("-f"), group }) != 0)
             QSKIP("cannot create the group privileged here");
-        const struct group *entry = ::getgrnam(group.toUtf8().constData());
-        QVERIFY(entry);
+        const struct group *entry = group.isEmpty() ? nullptr : ::getgrnam(group.toUtf8().constData());
+        QVERIFY(group.isEmpty() || entry);
         // The programs are copied where user 65534 may run them; the set-uid one blocks.
         const QString caller = m_busDir.filePath(QStringLiteral("forgedcaller"));
         const QString blocker = m_busDir.filePath(QStringLiteral("setuid-sleep"));
@@ -202,14 +159,22 @@ private Q_SLOTS:
         const QString results = m_busDir.filePath(QStringLiteral("results"));
         QVERIFY(QDir().mkpath(results));
         QVERIFY(::chmod(QFile::encodeName(results).constData(), 0777) == 0);
-        const QString result = results + QStringLiteral("/") + mode + group;
+        const QString result = results + QLatin1Char('/') + QString::fromLatin1(QTest::currentDataTag()).replace(QLatin1Char(' '), QLatin1Char('-'));
 
-        DeclarativeCoverActionList *list = makeList(1);
-        QSignalSpy triggered(list->actionList().first(), &DeclarativeCoverAction::triggered);
-        QStringList arguments { QStringLiteral("--reuid=65534"), QStringLiteral("--regid=%1").arg(entry->gr_gid), QStringLiteral("--clear-groups"),
-                                caller, mode, m_address, list->serviceName(), list->objectPath(), result };
-        if (mode == QLatin1String("setuid"))
-            arguments << blocker;
+        DeclarativeCoverActionList *list = makeList(3);
+        QList<QSharedPointer<QSignalSpy>> spies;
+        for (DeclarativeCoverAction *action : list->actionList())
+            spies << QSharedPointer<QSignalSpy>::create(action, &DeclarativeCoverAction::triggered);
+        QStringList arguments { caller, mode, m_address, list->serviceName(), list->objectPath(), result };
+        if (entry)
+            arguments = QStringList { QStringLiteral("--reuid=65534"), QStringLiteral("--regid=%1").arg(entry->gr_gid), QStringLiteral("--clear-groups") } + arguments;
+        else
+            arguments.prepend(QStringLiteral("--"));
+        arguments << (mode == QLatin1String("setuid") ? blocker : QString::number(index));
+        if (mode == QLatin1String("pidreuse"))
+            arguments.removeLast();
+        if (index < 0 || index >= 3)
+            QTest::ignoreMessage(QtWarningMsg, QRegularExpression(QStringLiteral("^CoverActionList: no action at index")));
         QProcess opener;
         opener.start(QStringLiteral("setpriv"), arguments);
         QVERIFY(opener.waitForStarted());
@@ -233,14 +198,14 @@ private Q_SLOTS:
         }
         QVERIFY(answer.open(QIODevice::ReadOnly));
         const QString text = QString::fromUtf8(answer.readAll());
-        if (group == QLatin1String("privileged")) {
+        for (int i = 0; i < spies.size(); ++i)
+            QCOMPARE(spies.at(i)->count(), i == triggered ? 1 : 0);
+        if (group.isEmpty() || group == QLatin1String("privileged"))
             QCOMPARE(text, QStringLiteral("ok"));
-            QCOMPARE(triggered.count(), 1);
-            return;
+        else {
+            QVERIFY2(text.startsWith(QLatin1String("org.freedesktop.DBus.Error.AccessDenied\n")), qPrintable(text));
+            QVERIFY2(text.contains(QRegularExpression(QStringLiteral("PID \\d+ is not in privileged group"))), qPrintable(text));
         }
-        QVERIFY2(text.startsWith(QLatin1String("org.freedesktop.DBus.Error.AccessDenied\n")), qPrintable(text));
-        QVERIFY2(text.contains(QRegularExpression(QStringLiteral("PID \\d+ is not in privileged group"))), qPrintable(text));
-        QCOMPARE(triggered.count(), 0);
     }
 
     void payload_data()
