@@ -29,6 +29,11 @@ private Q_SLOTS:
         QTest::newRow("Han") << QString::fromUtf8("\xe9\x9b\xbb \xe9\x83\xb5") << QString::fromUtf8("\xe9\x9b\xbb\xe9\x83\xb5");
         QTest::newRow("Devanagari with its marks") << QString::fromUtf8("\xe0\xa4\xa8\xe0\xa4\xbe\xe0\xa4\xae") << QString::fromUtf8("\xe0\xa4\xa8\xe0\xa4\xbe\xe0\xa4\xae");
         QTest::newRow("a letter beyond 16 bits") << QString::fromUtf8("k\xf0\x90\x90\x80/") << QString::fromUtf8("k\xf0\x90\x90\x80");
+        // Keys that name no file are refused with a warning.
+        QTest::newRow("refused: dot") << "." << ".";
+        QTest::newRow("refused: dot dot") << ".." << "..";
+        QTest::newRow("refused: empty") << "" << "";
+        QTest::newRow("refused: too long") << QString(300, QLatin1Char('k')) << QString(300, QLatin1Char('k'));
     }
 
     void keySanitising()
@@ -38,13 +43,21 @@ private Q_SLOTS:
         AutoFill fill;
         fill.setKey(key);
         QCOMPARE(fill.key(), stored);
-        // The key is the file's name, whole.
-        QTemporaryDir dir;
-        AutoFillDatabase database(dir.path());
-        QVERIFY(database.insert(fill.key(), QStringLiteral("remembered")));
+        // The key is the file's name, whole; nothing is ever written beside the folder.
+        const bool refused = QByteArray(QTest::currentDataTag()).startsWith("refused");
+        QTemporaryDir parent;
+        const QString directory = parent.filePath(QStringLiteral("autofill"));
+        AutoFillDatabase database(directory);
+        if (refused)
+            QTest::ignoreMessage(QtWarningMsg, QRegularExpression(QStringLiteral("^AutoFill: the key .* does not name a file")));
+        QCOMPARE(database.insert(fill.key(), QStringLiteral("remembered")), !refused);
         database.save();
-        QCOMPARE(QDir(dir.path()).entryList(QDir::Files | QDir::Hidden), QStringList({ stored }));
-        QCOMPARE(AutoFillDatabase::readFile(dir.filePath(stored)), QStringList({ "remembered" }));
+        const QStringList beside = QDir(parent.path()).entryList(QDir::AllEntries | QDir::NoDotAndDotDot);
+        QVERIFY(beside.isEmpty() || beside == QStringList({ "autofill" }));
+        QCOMPARE(QDir(directory).entryList(QDir::AllEntries | QDir::NoDotAndDotDot | QDir::Hidden),
+                 refused ? QStringList() : QStringList({ stored }));
+        if (!refused)
+            QCOMPARE(AutoFillDatabase::readFile(QDir(directory).filePath(stored)), QStringList({ "remembered" }));
     }
 
     // Newest first, a repeat moves to the front, fifty at most; saved one a line.
@@ -109,30 +122,6 @@ private Q_SLOTS:
         QCOMPARE(stored.at(1), QStringLiteral("second"));
         QCOMPARE(stored.at(2).size(), 3000);
         QVERIFY(stored.at(3).startsWith(QLatin1String("bad ")));
-    }
-
-    void keysThatNameNoFileAreRefused_data()
-    {
-        QTest::addColumn<QString>("key");
-        QTest::newRow("dot") << ".";
-        QTest::newRow("dot dot") << "..";
-        QTest::newRow("empty") << "";
-        QTest::newRow("too long") << QString(300, QLatin1Char('k'));
-    }
-
-    void keysThatNameNoFileAreRefused()
-    {
-        QFETCH(QString, key);
-        QTemporaryDir parent;
-        const QString directory = parent.filePath(QStringLiteral("autofill"));
-        AutoFillDatabase database(directory);
-        QTest::ignoreMessage(QtWarningMsg, QRegularExpression(QStringLiteral("^AutoFill: the key .* does not name a file")));
-        QVERIFY(!database.insert(key, QStringLiteral("secret")));
-        database.save();
-        // Nothing was written, in the folder or beside it (the folder itself may exist).
-        const QStringList beside = QDir(parent.path()).entryList(QDir::AllEntries | QDir::NoDotAndDotDot);
-        QVERIFY(beside.isEmpty() || beside == QStringList({ "autofill" }));
-        QCOMPARE(QDir(directory).entryList(QDir::AllEntries | QDir::NoDotAndDotDot), QStringList());
     }
 
     void unusableDirectoryKeepsSuggestionsInMemory()
