@@ -248,6 +248,7 @@ private Q_SLOTS:
         const QString a = QStringLiteral("org.quorvaneos.coveraction.pid7.id1");
         const QString b = QStringLiteral("org.quorvaneos.coveraction.pid7.id2");
         QTest::newRow("other list stays") << a + "\ntrigger\n0\nx\n" + b + "\ntrigger\n0\ny\n1" << b + "\ntrigger\n0\ny\n1";
+        QTest::newRow("other list first") << b + "\ntrigger\n0\ny\n" + a + "\ntrigger\n0\nx\n1" << b + "\ntrigger\n0\ny\n1";
         QTest::newRow("only this list") << a + "\ntrigger\n0\nx\n" + a + "\ntrigger\n1\nz\n0" << "";
         QTest::newRow("cut short") << a + "\ntrigger" << "";
         QTest::newRow("not ours, unreadable") << "garbage\n" + b + "\ntrigger\n0\ny\n1" << b + "\ntrigger\n0\ny\n1";
@@ -343,12 +344,19 @@ private Q_SLOTS:
         }
     }
 
-    void destroyedWindowIsAnnounced()
+    // A window without a native handle gets nothing; setting the same window again changes
+    // nothing; a destroyed window is announced.
+    void windowWithoutAHandleAndDestroyed()
     {
+        QVERIFY(recordedWindow());
         DeclarativeCoverActionList *list = makeList(1);
         auto window = new QQuickWindow;
         list->setWindow(window);
         QSignalSpy changed(list, &DeclarativeCoverActionList::windowChanged);
+        list->setWindow(window);
+        QTest::qWait(30);
+        QCOMPARE(m_payloads, QStringList());
+        QVERIFY(!window->handle());
         delete window;
         QCOMPARE(changed.count(), 1);
         QCOMPARE(list->window(), nullptr);
