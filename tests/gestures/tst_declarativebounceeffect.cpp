@@ -1,9 +1,7 @@
+#include "../common/sceneview.h"
 #include "gestures/declarativebounceeffect.h"
 
 #include <QGuiApplication>
-#include <QQmlEngine>
-#include <QQuickItem>
-#include <QQuickView>
 #include <QStyleHints>
 #include <QtTest>
 #include <qpa/qwindowsysteminterface.h>
@@ -70,14 +68,8 @@ private Q_SLOTS:
         QFETCH(bool, withMenu);
         QFETCH(QStringList, steps);
         m_view.reset(new QQuickView);
-        QQmlComponent component(m_view->engine());
-        component.setData(QString::fromUtf8(Document).arg(contentHeight).arg(withMenu ? "menu" : "null").toUtf8(), QUrl());
-        auto root = qobject_cast<QQuickItem *>(component.create());
-        QVERIFY2(root, qPrintable(component.errorString()));
-        m_view->setContent(QUrl(), nullptr, root);
-        m_view->resize(400, 600);
-        m_view->show();
-        QVERIFY(QTest::qWaitForWindowExposed(m_view.data()));
+        QQuickItem *root = showScene(*m_view, QString::fromUtf8(Document).arg(contentHeight).arg(withMenu ? "menu" : "null").toUtf8());
+        QVERIFY(root);
         auto effect = root->property("effect").value<DeclarativeBounceEffect *>();
         QSignalSpy active(effect, &DeclarativeBounceEffect::activeChanged);
         QSignalSpy difference(effect, &DeclarativeBounceEffect::differenceChanged);
