@@ -367,8 +367,14 @@ private Q_SLOTS:
         QLoggingCategory::setFilterRules(QStringLiteral("org.quorvaneos.pelkan.cover.debug=true"));
         s_messages.clear();
         const QtMessageHandler previous = qInstallMessageHandler(collectMessages);
-        // Each connection may own 40 names here: the 41st list is refused by the bus.
         DeclarativeCoverActionList *first = makeList(1);
+        // A name another connection holds is refused.
+        const QString next = first->serviceName().section(QLatin1String(".id"), 0, 0) + QStringLiteral(".id%1")
+                                     .arg(first->serviceName().section(QLatin1String(".id"), 1).toInt() + 1);
+        QVERIFY(QDBusConnection::connectToBus(m_address, QStringLiteral("squatter")).registerService(next));
+        QVERIFY(!makeList(1)->isRegistered());
+        QDBusConnection::disconnectFromBus(QStringLiteral("squatter"));
+        // Each connection may own 40 names here: the lists past that are refused by the bus.
         for (int i = 0; i < 40; ++i)
             makeList(1);
         qInstallMessageHandler(previous);
@@ -376,11 +382,12 @@ private Q_SLOTS:
 
         QVERIFY2(s_messages.contains(QStringLiteral("dbus ready ") + first->serviceName()), qPrintable(s_messages.join('\n')));
         const QStringList refused = s_messages.filter(QStringLiteral("Failed to register service"));
-        QVERIFY2(!refused.isEmpty(), qPrintable(s_messages.join('\n')));
-        QVERIFY2(refused.first().contains(QRegularExpression(QStringLiteral(
+        QVERIFY2(refused.size() >= 2 && refused.first().startsWith(QStringLiteral("Failed to register service: %1, error ").arg(next)),
+                 qPrintable(s_messages.join('\n')));
+        QVERIFY2(refused.last().contains(QRegularExpression(QStringLiteral(
                          "^Failed to register service: org\\.quorvaneos\\.coveraction\\.pid\\d+\\.id\\d+, "
                          "error org\\.freedesktop\\.DBus\\.Error\\.LimitsExceeded: \\S"))),
-                 qPrintable(refused.first()));
+                 qPrintable(refused.last()));
     }
 private:
     DeclarativeCoverActionList *makeList(int actions);
