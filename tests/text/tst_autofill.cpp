@@ -33,7 +33,11 @@ private Q_SLOTS:
         QTest::newRow("refused: dot") << "." << ".";
         QTest::newRow("refused: dot dot") << ".." << "..";
         QTest::newRow("refused: empty") << "" << "";
-        QTest::newRow("refused: too long") << QString(300, QLatin1Char('k')) << QString(300, QLatin1Char('k'));
+        QTest::newRow("a letter beyond 16 bits that decodes to no letter when read wrongly")
+                << QString::fromUtf8("x\xf0\x9d\x90\x80") << QString::fromUtf8("x\xf0\x9d\x90\x80");
+        QTest::newRow("a lone low surrogate after a letter") << QStringLiteral("ab") + QChar(0xdc00) << "ab";
+        QTest::newRow("200 bytes") << QString(200, QLatin1Char('k')) << QString(200, QLatin1Char('k'));
+        QTest::newRow("refused: 201 bytes") << QString(201, QLatin1Char('k')) << QString(201, QLatin1Char('k'));
     }
 
     void keySanitising()
@@ -148,6 +152,7 @@ private Q_SLOTS:
         for (int i = 0; i < 300; ++i)
             b << QStringLiteral("new suggestion, longer text %1").arg(i);
         QVERIFY(AutoFillDatabase::writeFile(path, a));
+        QVERIFY(!AutoFillDatabase::writeFile(dir.filePath(QStringLiteral("missing/k")), a));
 
         std::atomic<bool> writing(true);
         std::atomic<int> torn(0);
