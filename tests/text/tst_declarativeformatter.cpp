@@ -135,60 +135,6 @@ private Q_SLOTS:
         QCOMPARE(F().formatDate(value, type), expected.startsWith(QLatin1String("warning: ")) ? QString() : expected);
     }
 
-    void formatFileSize_data()
-    {
-        QTest::addColumn<qlonglong>("bytes");
-        QTest::addColumn<int>("precision");
-        QTest::addColumn<QString>("expected");
-        QTest::newRow("0") << 0LL << 1 << "0 bytes";
-        QTest::newRow("1") << 1LL << 1 << "1 byte";
-        QTest::newRow("99") << 99LL << 1 << "99 bytes";
-        QTest::newRow("100") << 100LL << 1 << "0.1 kB";
-        QTest::newRow("102 347") << 102347LL << 1 << "99.9 kB";
-        QTest::newRow("102 348") << 102348LL << 1 << "0.1 MB";
-        QTest::newRow("last MB") << 1048523570LL << 1 << "999.9 MB";
-        QTest::newRow("first GB") << 1048523571LL << 1 << "1.0 GB";
-        QTest::newRow("last GB") << 1073688136907LL << 1 << "999.9 GB";
-        QTest::newRow("first TB") << 1073688136908LL << 1 << "1.0 TB";
-        QTest::newRow("precision 0") << 1536LL << 0 << "2 kB";
-        QTest::newRow("precision 2") << 1536LL << 2 << "1.50 kB";
-        QTest::newRow("negative precision") << 1024LL << -3 << "1.0 kB";
-        QTest::newRow("negative size") << -5LL << 1 << "-5";
-        QTest::newRow("precision past a double's digits") << 1536LL << 2147483647 << "1.50000000000000000 kB";
-    }
-
-    void formatFileSize()
-    {
-        QFETCH(qlonglong, bytes);
-        QFETCH(int, precision);
-        QFETCH(QString, expected);
-        QCOMPARE(F().formatFileSize(bytes, precision), expected);
-    }
-
-    void formatDuration_data()
-    {
-        QTest::addColumn<int>("seconds");
-        QTest::addColumn<int>("type");
-        QTest::addColumn<QString>("expected");
-        QTest::newRow("3 700 long") << 3700 << int(F::DurationLong) << "1:01:40";
-        QTest::newRow("3 700 short") << 3700 << int(F::DurationShort) << "1:40";
-        QTest::newRow("90 000 long, hours not wrapped") << 90000 << int(F::DurationLong) << "25:00:00";
-        QTest::newRow("59 long") << 59 << int(F::DurationLong) << "0:00:59";
-        QTest::newRow("1000 hours, grouped") << 3600000 << int(F::DurationLong) << "1,000:00:00";
-        QTest::newRow("other type is long") << 61 << int(F::DateFull) << "0:01:01";
-    }
-
-    void formatDuration()
-    {
-        QFETCH(int, seconds);
-        QFETCH(int, type);
-        QFETCH(QString, expected);
-        QCOMPARE(F().formatDuration(seconds, type), expected);
-        // The built-in patterns are the catalogue's.
-        useCatalogue(false);
-        QCOMPARE(F().formatDuration(seconds, type), expected);
-    }
-
     void durationSweepMatchesLocale()
     {
         // Every minute and second field, padded or not, as the locale's time formatter writes it.
@@ -238,10 +184,12 @@ private Q_SLOTS:
         QCOMPARE(text, expected);
     }
 
-    void text_data()
+    void operations_data()
     {
-        // Operations: formatText of the two types, _joinNames (and whether it needed a
-        // space), textDirection, formatArticle. "warning: <text>": empty, with that warning.
+        // Operations: formatFileSize (bytes, precision), formatDuration (seconds, long, short
+        // or another type; the same without the catalogue), formatText of the two types,
+        // _joinNames (and whether it needed a space), textDirection, formatArticle.
+        // "warning: <text>": empty, with that warning.
         QTest::addColumn<QString>("operation");
         QTest::addColumn<QString>("first");
         QTest::addColumn<QString>("second");
@@ -250,6 +198,27 @@ private Q_SLOTS:
             QTest::newRow(tag) << operation << first << second << expected;
         };
         const QString locale = QLocale().textDirection() == Qt::RightToLeft ? "rtl" : "ltr";
+        row("size 0", "size", "0", "1", "0 bytes");
+        row("size 1", "size", "1", "1", "1 byte");
+        row("size 99", "size", "99", "1", "99 bytes");
+        row("size 100", "size", "100", "1", "0.1 kB");
+        row("size 102 347", "size", "102347", "1", "99.9 kB");
+        row("size 102 348", "size", "102348", "1", "0.1 MB");
+        row("size last MB", "size", "1048523570", "1", "999.9 MB");
+        row("size first GB", "size", "1048523571", "1", "1.0 GB");
+        row("size last GB", "size", "1073688136907", "1", "999.9 GB");
+        row("size first TB", "size", "1073688136908", "1", "1.0 TB");
+        row("size precision 0", "size", "1536", "0", "2 kB");
+        row("size precision 2", "size", "1536", "2", "1.50 kB");
+        row("size negative precision", "size", "1024", "-3", "1.0 kB");
+        row("size negative size", "size", "-5", "1", "-5");
+        row("size precision past a double's digits", "size", "1536", "2147483647", "1.50000000000000000 kB");
+        row("duration 3 700 long", "duration", "3700", "long", "1:01:40");
+        row("duration 3 700 short", "duration", "3700", "short", "1:40");
+        row("duration 90 000 long, hours not wrapped", "duration", "90000", "long", "25:00:00");
+        row("duration 59 long", "duration", "59", "long", "0:00:59");
+        row("duration 1000 hours, grouped", "duration", "3600000", "long", "1,000:00:00");
+        row("duration other type is long", "duration", "61", "date full", "0:01:01");
         row("ascii: U+0080 passes, é does not", "ascii", QStringLiteral("a\u0080\u00e9"), "", QStringLiteral("a\u0080"));
         row("ascii kept", "ascii", "Hello, world!", "", "Hello, world!");
         row("portable filename", "portable", "My File (1).txt", "", "MyFile1.txt");
@@ -269,7 +238,7 @@ private Q_SLOTS:
         row("unknown article", "article", "2", "", "warning: formatArticle: unknown article type: 2");
     }
 
-    void text()
+    void operations()
     {
         QFETCH(QString, operation);
         QFETCH(QString, first);
@@ -277,7 +246,15 @@ private Q_SLOTS:
         QFETCH(QString, expected);
         F formatter;
         QString result;
-        if (operation == QLatin1String("ascii") || operation == QLatin1String("portable")) {
+        if (operation == QLatin1String("size")) {
+            result = formatter.formatFileSize(first.toLongLong(), second.toInt());
+        } else if (operation == QLatin1String("duration")) {
+            const int type = second == QLatin1String("long") ? F::DurationLong : second == QLatin1String("short") ? F::DurationShort : F::DateFull;
+            result = formatter.formatDuration(first.toInt(), type);
+            // The built-in patterns are the catalogue's.
+            useCatalogue(false);
+            QCOMPARE(formatter.formatDuration(first.toInt(), type), expected);
+        } else if (operation == QLatin1String("ascii") || operation == QLatin1String("portable")) {
             result = formatter.formatText(first, operation == QLatin1String("ascii") ? F::Ascii7Bit : F::PortableFilename);
         } else if (operation == QLatin1String("join")) {
             result = formatter._joinNames(first, second);
