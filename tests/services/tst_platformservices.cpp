@@ -1,6 +1,7 @@
 #include "../common/configfixture.h"
 #include "text/declarativeformatter.h"
 
+#include <QClipboard>
 #include <QGuiApplication>
 #include <QQmlComponent>
 #include <QQmlEngine>
@@ -14,8 +15,8 @@
 static const QString Key = QStringLiteral("/desktop/pelkan-test/columns");
 static const QString ProfileRoot = QStringLiteral("/quorvane/profile/");
 
-// Configuration, sound profile and time zone as QML sees them: bindings follow changes
-// written from another process or made by the system, live.
+// Configuration, sound profile, time zone and clipboard as QML sees them: bindings follow
+// changes written from another process or made by the system, live.
 class tst_PlatformServices : public QObject
 {
     Q_OBJECT
@@ -146,6 +147,34 @@ private Q_SLOTS:
             qputenv("TZ", original);
         tzset();
     }
+    void clipboard()
+    {
+        QGuiApplication::clipboard()->clear();
+        QScopedPointer<QObject> object(create("QtObject { property QtObject it: Clipboard }"));
+        QVERIFY(object);
+        QObject *clipboard = object->property("it").value<QObject *>();
+        QTRY_VERIFY(!clipboard->property("hasText").toBool());
+        QSignalSpy text(clipboard, SIGNAL(textChanged()));
+        QSignalSpy hasText(clipboard, SIGNAL(hasTextChanged()));
+
+        // Another writer is seen.
+        QGuiApplication::clipboard()->setText(QStringLiteral("copied"));
+        QTRY_COMPARE(clipboard->property("text").toString(), QStringLiteral("copied"));
+        QVERIFY(clipboard->property("hasText").toBool());
+        QCOMPARE(text.count(), 1);
+        QCOMPARE(hasText.count(), 1);
+
+        // Writing from QML reaches the system clipboard.
+        QVERIFY(clipboard->setProperty("text", QStringLiteral("pasted")));
+        QTRY_COMPARE(QGuiApplication::clipboard()->text(), QStringLiteral("pasted"));
+        QTRY_COMPARE(text.count(), 2);
+        QCOMPARE(hasText.count(), 1);
+
+        QVERIFY(clipboard->setProperty("text", QString()));
+        QTRY_VERIFY(!clipboard->property("hasText").toBool());
+        QCOMPARE(hasText.count(), 2);
+    }
+
 private:
     QObject *create(const QByteArray &body);
     QQmlEngine m_engine;
