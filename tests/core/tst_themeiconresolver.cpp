@@ -104,6 +104,7 @@ private Q_SLOTS:
         QVERIFY(!resolver.resolvePath(QStringLiteral("icon-m-back")).isEmpty());
         QVERIFY(!resolver.resolvePath(QStringLiteral("graphic-shader-texture")).isEmpty());
     }
+
 private:
     void touch(const QString &relative);
     QTemporaryDir m_theme;

@@ -147,6 +147,7 @@ private Q_SLOTS:
             qputenv("TZ", original);
         tzset();
     }
+
     void clipboard()
     {
         QGuiApplication::clipboard()->clear();

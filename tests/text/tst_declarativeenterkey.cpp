@@ -142,6 +142,7 @@ private Q_SLOTS:
         QCOMPARE(root->inputMethodQuery(Qt::ImEnterKeyType).toInt(), int(Qt::EnterKeyDone));
         QCOMPARE(changed.count(), 1);
     }
+
 private:
     QQuickItem *load(const QByteArray &body);
     QQmlEngine m_engine;

@@ -315,6 +315,7 @@ private Q_SLOTS:
         useCatalogue(false);
         QCOMPARE(F().trId(id, catalog, n, locale), expected);
     }
+
 private:
     void useCatalogue(bool on);
     QTranslator m_catalogue;

@@ -35,6 +35,7 @@ private Q_SLOTS:
         QTRY_VERIFY(m_field->hasActiveFocus());
         m_field->setProperty("cursorPosition", 3);
     }
+
     void cleanup() { m_window.reset(); }
 
     void composingInsertsAtTheCursor()
@@ -110,6 +111,7 @@ private Q_SLOTS:
         QCOMPARE(messages, 0);
         QCOMPARE(object->property("preedit").value<DeclarativePreeditText *>()->text(), text);
     }
+
 private:
     QQmlEngine m_engine;
     QScopedPointer<QQuickWindow> m_window;

@@ -389,6 +389,7 @@ private Q_SLOTS:
                          "error org\\.freedesktop\\.DBus\\.Error\\.LimitsExceeded: \\S"))),
                  qPrintable(refused.last()));
     }
+
 private:
     DeclarativeCoverActionList *makeList(int actions);
 

@@ -360,6 +360,7 @@ private Q_SLOTS:
         loose._queueDeletion(object);
         QTRY_VERIFY(looseGuard.isNull());
     }
+
 private:
     DeclarativeWindow *showWindow();
     void record(const QString &platform)
