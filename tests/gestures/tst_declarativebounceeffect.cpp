@@ -58,7 +58,8 @@ private Q_SLOTS:
                 << QStringList{ "P 100,100", "M 99+T,100", "= 0 0", "M 110+T,100", "= 1 10", "M 100+T,100", "= 1 0", "R" };
         QTest::newRow("pulled left at the end")
                 << "contentWidth: 1000; contentHeight: 300; contentX: 600"
-                << QStringList{ "P 300,100", "M 301-T,100", "= 0 0", "M 290-T,100", "= 1 10", "M 300-T,100", "= 1 0", "R" };
+                << QStringList{ "P 300,100", "M 301-T,100", "= 0 0", "M 290-T,100", "= 1 10", "M 270-T,100", "= 1 10", "R" };
+        QTest::newRow("pushed up at the top") << "" << QStringList{ "P 200", "M 200-T", "= 0", "R" };
         QTest::newRow("pressed outside") << "" << QStringList{ "P 400", "M 420", "M 480", "M 560", "= 0", "R" };
         QTest::newRow("an item inside keeps the grab") << "MouseArea { width: 400; height: 1000; preventStealing: true }"
                                                       << QStringList{ "P 100", "M 110+T", "= 0", "R" };
