@@ -1,4 +1,5 @@
 #include "../common/configfixture.h"
+#include "services/timezoneupdater.h"
 #include "text/declarativeformatter.h"
 
 #include <QClipboard>
@@ -7,6 +8,7 @@
 #include <QQmlEngine>
 #include <QQuickItem>
 #include <QQuickWindow>
+#include <QTemporaryDir>
 #include <QtTest>
 
 #include <cstdlib>
@@ -16,7 +18,8 @@ static const QString Key = QStringLiteral("/desktop/pelkan-test/columns");
 static const QString ProfileRoot = QStringLiteral("/quorvane/profile/");
 
 // Configuration, sound profile, time zone and clipboard as QML sees them: bindings follow
-// changes written from another process or made by the system, live.
+// changes written from another process or made by the system, live. And the watcher of
+// the time-zone file behind them.
 class tst_PlatformServices : public QObject
 {
     Q_OBJECT
@@ -174,6 +177,50 @@ private Q_SLOTS:
         QVERIFY(clipboard->setProperty("text", QString()));
         QTRY_VERIFY(!clipboard->property("hasText").toBool());
         QCOMPARE(hasText.count(), 2);
+    }
+
+    // The time-zone updater sees the zone file replaced or rewritten, and nothing else.
+    void timeZoneFileChanges_data()
+    {
+        // Steps: "link <zone>" replaces the zone file by a link, atomically, the way the
+        // system's time settings do; "write <name>" writes a plain file in its folder.
+        QTest::addColumn<QStringList>("before");
+        QTest::addColumn<QStringList>("steps");
+        QTest::addColumn<int>("changes");
+        QTest::newRow("replaced link, twice: the folder watch survives")
+                << QStringList{ "link Europe/Helsinki" } << QStringList{ "link Asia/Tokyo", "link America/Lima" } << 2;
+        QTest::newRow("rewritten file") << QStringList{ "write localtime" } << QStringList{ "write localtime" } << 1;
+        QTest::newRow("missing file appearing") << QStringList{} << QStringList{ "link Europe/Helsinki" } << 1;
+        QTest::newRow("unrelated file") << QStringList{ "link Europe/Helsinki" } << QStringList{ "write hostname" } << 0;
+    }
+
+    void timeZoneFileChanges()
+    {
+        QFETCH(QStringList, before);
+        QFETCH(QStringList, steps);
+        QFETCH(int, changes);
+        QTemporaryDir dir;
+        const QString zoneFile = dir.filePath(QStringLiteral("localtime"));
+        auto apply = [&](const QString &step) {
+            const QString argument = step.section(QLatin1Char(' '), 1);
+            if (step.startsWith(QLatin1String("write"))) {
+                QFile file(dir.filePath(argument));
+                return file.open(QIODevice::WriteOnly | QIODevice::Append) && file.write("TZif-more") > 0;
+            }
+            const QString temporary = zoneFile + QLatin1String(".new");
+            return QFile::link(QStringLiteral("/usr/share/zoneinfo/") + argument, temporary)
+                    && ::rename(QFile::encodeName(temporary), QFile::encodeName(zoneFile)) == 0;
+        };
+        for (const QString &step : qAsConst(before))
+            QVERIFY(apply(step));
+        TimeZoneUpdater updater(zoneFile);
+        QSignalSpy changed(&updater, &TimeZoneUpdater::timeZoneChanged);
+        for (int i = 0; i < steps.size(); ++i) {
+            QVERIFY(apply(steps.at(i)));
+            QTRY_COMPARE(changed.count(), qMin(i + 1, changes));
+        }
+        QTest::qWait(300);
+        QCOMPARE(changed.count(), changes);
     }
 
 private:
