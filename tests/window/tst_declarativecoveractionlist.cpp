@@ -277,10 +277,18 @@ private Q_SLOTS:
         QCOMPARE(published.size(), 1);
         QVERIFY(published.first().endsWith(QLatin1String("\n0\nimage://theme/a\n1")));
 
-        // Disabled: its entries are taken out of the window's payload.
+        // Disabled: its entries are taken out of the window's payload, and the log says so.
+        QLoggingCategory::setFilterRules(QStringLiteral("org.quorvaneos.pelkan.cover.debug=true"));
+        s_messages.clear();
+        const QtMessageHandler previous = qInstallMessageHandler(collectMessages);
         list->setEnabled(false);
         QTRY_COMPARE(published.size(), 2);
+        qInstallMessageHandler(previous);
+        QLoggingCategory::setFilterRules(QString());
         QCOMPARE(published.last(), QString());
+        QVERIFY2(!s_messages.filter(QRegularExpression(QStringLiteral("^disableActiveCovers, process: %1, winId: [1-9]\\d*, action count: 1, enabled: 0$")
+                                                               .arg(QCoreApplication::applicationPid()))).isEmpty(),
+                 qPrintable(s_messages.join('\n')));
     }
 
     void windowShowsTheLatestEnabledList_data()
