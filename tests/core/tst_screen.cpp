@@ -17,56 +17,45 @@ private Q_SLOTS:
     void init() { QVERIFY(ConfigFixture::reset(DiagonalKey)); }
     void cleanupTestCase() { ConfigFixture::reset(DiagonalKey); }
 
-    void categoryForDiagonal_data();
-    void categoryForDiagonal();
-    void configuredDiagonalOverridesDisplay();
-    void invalidDiagonalIsIgnored();
+    void categoryForDiagonal_data()
+    {
+        QTest::addColumn<qreal>("inches");
+        QTest::addColumn<int>("category");
+        QTest::newRow("just below medium") << 4.49 << int(Screen::Small);
+        QTest::newRow("medium starts") << 4.5 << int(Screen::Medium);
+        QTest::newRow("large starts") << 7.0 << int(Screen::Large);
+        QTest::newRow("extra large starts") << 11.0 << int(Screen::ExtraLarge);
+        QTest::newRow("monitor") << 24.0 << int(Screen::ExtraLarge);
+    }
+
+    void categoryForDiagonal()
+    {
+        QFETCH(qreal, inches);
+        QFETCH(int, category);
+        QCOMPARE(int(Screen::categoryForDiagonal(inches)), category);
+    }
+
+    // A configured diagonal overrides the display's and moves the size category; an
+    // unusable one gives the display's own measurement back.
+    void configuredDiagonal()
+    {
+        const qreal display = Screen().diagonal();
+        Screen screen;
+        QVERIFY(ConfigFixture::write(DiagonalKey, QStringLiteral("5.5")));
+        QTRY_COMPARE(screen.diagonal(), 5.5);
+        QCOMPARE(screen.sizeCategory(), Screen::Medium);
+
+        QSignalSpy changed(&screen, &Screen::sizeCategoryChanged);
+        QVERIFY(ConfigFixture::write(DiagonalKey, QStringLiteral("10.0")));
+        QTRY_COMPARE(changed.count(), 1);
+        QCOMPARE(screen.sizeCategory(), Screen::Large);
+        QTRY_COMPARE(Screen::instance()->sizeCategory(), Screen::Large);
+
+        QTest::ignoreMessage(QtWarningMsg, QRegularExpression(QStringLiteral("^Screen: ignoring invalid diagonal")));
+        QVERIFY(ConfigFixture::write(DiagonalKey, QStringLiteral("-3.0")));
+        QTRY_COMPARE(screen.diagonal(), display);
+    }
 };
-
-void tst_Screen::categoryForDiagonal_data()
-{
-    QTest::addColumn<qreal>("inches");
-    QTest::addColumn<int>("category");
-    QTest::newRow("just below medium") << 4.49 << int(Screen::Small);
-    QTest::newRow("medium starts") << 4.5 << int(Screen::Medium);
-    QTest::newRow("large starts") << 7.0 << int(Screen::Large);
-    QTest::newRow("extra large starts") << 11.0 << int(Screen::ExtraLarge);
-    QTest::newRow("monitor") << 24.0 << int(Screen::ExtraLarge);
-}
-
-void tst_Screen::categoryForDiagonal()
-{
-    QFETCH(qreal, inches);
-    QFETCH(int, category);
-    QCOMPARE(int(Screen::categoryForDiagonal(inches)), category);
-}
-
-void tst_Screen::configuredDiagonalOverridesDisplay()
-{
-    Screen screen;
-    QVERIFY(ConfigFixture::write(DiagonalKey, QStringLiteral("5.5")));
-    QTRY_COMPARE(screen.diagonal(), 5.5);
-    QCOMPARE(screen.sizeCategory(), Screen::Medium);
-
-    QSignalSpy changed(&screen, &Screen::sizeCategoryChanged);
-    QVERIFY(ConfigFixture::write(DiagonalKey, QStringLiteral("10.0")));
-    QTRY_COMPARE(changed.count(), 1);
-    QCOMPARE(screen.sizeCategory(), Screen::Large);
-    QTRY_COMPARE(Screen::instance()->sizeCategory(), Screen::Large);
-}
-
-void tst_Screen::invalidDiagonalIsIgnored()
-{
-    const qreal display = Screen().diagonal();
-    Screen screen;
-    QVERIFY(ConfigFixture::write(DiagonalKey, QStringLiteral("%1").arg(display + 1.0, 0, 'f', 2)));
-    QTRY_VERIFY(qAbs(screen.diagonal() - (display + 1.0)) < 0.01);
-
-    // An unusable value gives the display's own measurement back.
-    QTest::ignoreMessage(QtWarningMsg, QRegularExpression(QStringLiteral("^Screen: ignoring invalid diagonal")));
-    QVERIFY(ConfigFixture::write(DiagonalKey, QStringLiteral("-3.0")));
-    QTRY_COMPARE(screen.diagonal(), display);
-}
 
 QTEST_MAIN(tst_Screen)
 #include "tst_screen.moc"

@@ -7,10 +7,7 @@
 
 namespace {
 
-QString event(const QJsonObject &record)
-{
-    return record.value(QLatin1String("event")).toString();
-}
+QString event(const QJsonObject &record) { return record.value(QLatin1String("event")).toString(); }
 
 } // namespace
 

@@ -18,18 +18,241 @@ class tst_HomeScreen : public QObject
     Q_OBJECT
 
 private Q_SLOTS:
-    void applicationWindowProperties_data();
-    void applicationWindowProperties();
-    void coverWindowPairsWithApplication_data();
-    void coverWindowPairsWithApplication();
-    void coverActionsEndToEnd();
-    void twoActionListsOnOneWindow_data();
-    void twoActionListsOnOneWindow();
-    void coverStatusFromHomeScreen();
-    void backKey_data();
-    void backKey();
-    void backKeyThroughThePageStack();
-    void leavesNoProcessBehind();
+    void windowProperties_data()
+    {
+        QTest::addColumn<QStringList>("properties");
+        QTest::addColumn<QStringList>("expected");
+        QTest::addColumn<QStringList>("coverExpected");
+        const QStringList common { "BACKGROUND_VISIBLE", "WINID", "QUORVANE_COVER_WINDOW", "QUORVANE_HAVE_COVER" };
+        QTest::newRow("category") << QStringList { "category=true" } << common + QStringList { "CATEGORY", "WINDOW_OPACITY" }
+                                  << QStringList { "TRANSPARENT", "WINID", "CATEGORY", "QUORVANE_COVER_WINDOW", "QUORVANE_APPLICATION_WINDOW" };
+        QTest::newRow("no category") << QStringList { "category=false" } << common + QStringList { "WINDOW_OPACITY" }
+                                     << QStringList { "TRANSPARENT", "WINID", "CATEGORY" };
+        QTest::newRow("background rectangle") << QStringList { "category=false", "backgroundHeight=50" }
+                                              << common + QStringList { "WINDOW_OPACITY", "BACKGROUND_RECT" }
+                                              << QStringList { "TRANSPARENT", "WINID", "CATEGORY" };
+    }
+
+    // What the application window and its cover window publish, and how they pair.
+    void windowProperties()
+    {
+        QFETCH(QStringList, properties);
+        QFETCH(QStringList, expected);
+        QFETCH(QStringList, coverExpected);
+        const bool category = expected.contains(QLatin1String("CATEGORY"));
+        HomeScreenSession session;
+        QVERIFY(run(session, properties));
+
+        const int application = session.surfaceWith(QStringLiteral("BACKGROUND_VISIBLE"));
+        QVERIFY(session.waitForPropertySequence(application, expected));
+        // Each publication sends the whole set in the same order; the window may publish
+        // more than once (when shown, when its cover arrives). Other properties of the
+        // window (the cover actions, keeping the cover) come on their own.
+        QStringList published;
+        for (const QJsonObject &record : session.properties(application)) {
+            if (name(record) != QLatin1String("_APP_COVER_ACTION") && name(record) != QLatin1String("QUORVANE_RETAIN_COVER"))
+                published << name(record);
+        }
+        QCOMPARE(published.size() % expected.size(), 0);
+        for (int i = 0; i < published.size(); i += expected.size())
+            QCOMPARE(published.mid(i, expected.size()), expected);
+
+        const QJsonObject visible = session.lastProperty(application, QStringLiteral("BACKGROUND_VISIBLE"));
+        QCOMPARE(visible.value(QLatin1String("type")).toString(), QStringLiteral("bool"));
+        QCOMPARE(value(visible), QStringLiteral("true"));
+        QCOMPARE(value(session.lastProperty(application, QStringLiteral("WINDOW_OPACITY"))), QStringLiteral("1"));
+        QCOMPARE(session.lastProperty(application, QStringLiteral("WINID")).value(QLatin1String("type")).toString(),
+                 QStringLiteral("qulonglong"));
+        if (category)
+            QCOMPARE(value(session.lastProperty(application, QStringLiteral("CATEGORY"))), QStringLiteral("pelkan"));
+        if (expected.contains(QLatin1String("BACKGROUND_RECT")))
+            QCOMPARE(value(session.lastProperty(application, QStringLiteral("BACKGROUND_RECT"))), QStringLiteral("0,10,270,50"));
+
+        // The cover's properties arrive together, but not necessarily with its category.
+        QVERIFY(!session.waitFor([](const QJsonObject &r) {
+            return r.value(QLatin1String("event")) == QLatin1String("property") && name(r) == QLatin1String("TRANSPARENT");
+        }).isEmpty());
+        const int cover = session.surfaceWith(QStringLiteral("TRANSPARENT"));
+        QVERIFY(cover != 0 && cover != application);
+        // Properties set before the compositor's side of a window exists reach it all at
+        // once, sorted by name, when it is made; the window's own publication keeps order.
+        QVERIFY(session.waitForPropertySequence(cover, coverExpected));
+        QCOMPARE(value(session.lastProperty(cover, QStringLiteral("TRANSPARENT"))), QStringLiteral("true"));
+        QCOMPARE(value(session.lastProperty(cover, QStringLiteral("CATEGORY"))),
+                 category ? QStringLiteral("pelkan-cover") : QStringLiteral("cover"));
+
+        // Each window names the other by the id the other published as its own.
+        const QString coverId = value(session.lastProperty(cover, QStringLiteral("WINID")));
+        const QString applicationId = value(session.lastProperty(application, QStringLiteral("WINID")));
+        QVERIFY(!coverId.isEmpty() && coverId != applicationId);
+        QCOMPARE(value(session.lastProperty(application, QStringLiteral("QUORVANE_COVER_WINDOW"))), coverId);
+        if (category) {
+            QCOMPARE(value(session.lastProperty(cover, QStringLiteral("QUORVANE_COVER_WINDOW"))), coverId);
+            QCOMPARE(value(session.lastProperty(cover, QStringLiteral("QUORVANE_APPLICATION_WINDOW"))), applicationId);
+            const QJsonObject paired = session.waitForEvent(QStringLiteral("paired"));
+            QCOMPARE(paired.value(QLatin1String("application")).toInt(), application);
+            QCOMPARE(paired.value(QLatin1String("cover")).toInt(), cover);
+        } else {
+            QVERIFY(session.lastProperty(cover, QStringLiteral("QUORVANE_APPLICATION_WINDOW")).isEmpty());
+            QVERIFY(session.waitForEvent(QStringLiteral("paired"), 300).isEmpty());
+        }
+    }
+
+    void coverActionsEndToEnd()
+    {
+        HomeScreenSession session;
+        QVERIFY(run(session, {}));
+
+        const QJsonObject published = session.waitForEvent(QStringLiteral("coverActions"));
+        const QJsonArray actions = published.value(QLatin1String("actions")).toArray();
+        QCOMPARE(actions.size(), 2);
+        QCOMPARE(published.value(QLatin1String("surface")).toInt(), session.surfaceWith(QStringLiteral("BACKGROUND_VISIBLE")));
+        const QString service = actions.at(0).toObject().value(QLatin1String("service")).toString();
+        QVERIFY(service.startsWith(QLatin1String("org.quorvaneos.coveraction.pid")));
+
+        const QStringList lines = value(session.lastProperty(published.value(QLatin1String("surface")).toInt(),
+                                                             QStringLiteral("_APP_COVER_ACTION"))).split(QLatin1Char('\n'));
+        QCOMPARE(lines, QStringList({ service, "trigger", "0", "image://theme/icon-cover-pause",
+                                      service, "trigger", "1", "image://theme/icon-cover-next", "0" }));
+
+        // The cover's status follows the home screen's signal; an unknown one is dropped.
+        session.send(QStringLiteral("coverstatus 7"));
+        session.send(QStringLiteral("coverstatus 2"));
+        QVERIFY(session.waitForLog(QStringLiteral("e2e: cover status 2")));
+        QVERIFY(!session.log().contains(QLatin1String("e2e: cover status 7")));
+
+        // The home screen presses the second action: the second action fires, and only it.
+        session.send(QStringLiteral("trigger 1"));
+        const QJsonObject reply = session.waitForEvent(QStringLiteral("triggered"));
+        QCOMPARE(reply.value(QLatin1String("index")).toInt(), 1);
+        if (!privilegedHere()) {
+            QCOMPARE(reply.value(QLatin1String("error")).toString(), QStringLiteral("org.freedesktop.DBus.Error.AccessDenied"));
+            QCOMPARE(reply.value(QLatin1String("message")).toString(),
+                     QStringLiteral("PID %1 is not in privileged group").arg(session.homeScreenPid()));
+            QSKIP("the home screen is not privileged here: presses are refused, as they must be");
+        }
+        QCOMPARE(reply.value(QLatin1String("error")).toString(), QString());
+        QVERIFY(session.waitForLog(QStringLiteral("e2e: action 1")));
+        QVERIFY(!session.log().contains(QLatin1String("e2e: action 0")));
+
+        // The first action switches the list off: its entries leave the window.
+        session.send(QStringLiteral("trigger 0"));
+        QVERIFY(session.waitForLog(QStringLiteral("e2e: action 0")));
+        const QJsonObject emptied = session.waitForEvent(QStringLiteral("coverActions"));
+        QCOMPARE(emptied.value(QLatin1String("actions")).toArray().size(), 0);
+        QVERIFY(!emptied.contains(QLatin1String("error")));
+    }
+
+    void twoActionListsOnOneWindow_data()
+    {
+        QTest::addColumn<int>("press");
+        QTest::addColumn<bool>("secondStaysOnBus");
+        QTest::newRow("second list emptied") << 0 << true;
+        QTest::newRow("second list destroyed") << 1 << false;
+    }
+
+    // The window shows the list enabled last; when it empties or goes, the first one's
+    // buttons come back, and a destroyed list's bus name goes with it.
+    void twoActionListsOnOneWindow()
+    {
+        QFETCH(int, press);
+        QFETCH(bool, secondStaysOnBus);
+        if (!privilegedHere())
+            QSKIP("the home screen must be privileged to press cover actions");
+        HomeScreenSession session;
+        QVERIFY(run(session, { QStringLiteral("lists=2") }));
+        auto shownService = [](const QJsonObject &published) {
+            return published.value(QLatin1String("actions")).toArray().at(0).toObject().value(QLatin1String("service")).toString();
+        };
+        auto showing = [&shownService](const char *id) {
+            return [&shownService, id](const QJsonObject &r) {
+                return r.value(QLatin1String("event")) == QLatin1String("coverActions") && shownService(r).endsWith(QLatin1String(id));
+            };
+        };
+        const QString second = shownService(session.waitFor(showing(".id2")));
+        QVERIFY(!second.isEmpty());
+
+        session.send(QStringLiteral("trigger %1").arg(press));
+        const QJsonObject reply = session.waitForEvent(QStringLiteral("triggered"));
+        QCOMPARE(reply.value(QLatin1String("service")).toString(), second);
+        QCOMPARE(reply.value(QLatin1String("error")).toString(), QString());
+        // Straight from one list's buttons to the other's, with no empty set between (the
+        // second list's set may come again first: the window republishes it when shown).
+        const QJsonObject shown = session.waitFor([&](const QJsonObject &r) {
+            return r.value(QLatin1String("event")) == QLatin1String("coverActions") && shownService(r) != second;
+        });
+        QVERIFY2(shownService(shown).endsWith(QLatin1String(".id1")), qPrintable(QJsonDocument(shown).toJson()));
+        QCOMPARE(shown.value(QLatin1String("actions")).toArray().size(), 2);
+
+        session.send(QStringLiteral("names"));
+        const QJsonArray names = session.waitForEvent(QStringLiteral("names")).value(QLatin1String("names")).toArray();
+        QCOMPARE(names.contains(second), secondStaysOnBus);
+        QCOMPARE(names.size(), secondStaysOnBus ? 2 : 1);
+    }
+
+    void backKey_data()
+    {
+        QTest::addColumn<int>("depth");
+        QTest::addColumn<bool>("lowers");
+        QTest::newRow("one page") << 1 << true;
+        QTest::newRow("two pages") << 2 << false;
+    }
+
+    void backKey()
+    {
+        QFETCH(int, depth);
+        QFETCH(bool, lowers);
+        HomeScreenSession session;
+        QVERIFY(run(session, { QStringLiteral("depth=%1").arg(depth) }));
+        const int application = session.surfaceWith(QStringLiteral("BACKGROUND_VISIBLE"));
+        session.send(QStringLiteral("focus"));
+        QVERIFY(session.waitForLog(QStringLiteral("e2e: active true")));
+
+        session.send(QStringLiteral("key back"));
+        QCOMPARE(session.waitForEvent(QStringLiteral("keySent")).value(QLatin1String("surface")).toInt(), application);
+        if (lowers) {
+            QCOMPARE(session.waitForEvent(QStringLiteral("lower")).value(QLatin1String("surface")).toInt(), application);
+            QVERIFY(!session.log().contains(QLatin1String("e2e: pop")));
+        } else {
+            QVERIFY(session.waitForLog(QStringLiteral("e2e: pop from depth 2")));
+            // Now one page is left: the next Back lowers the window.
+            QVERIFY(session.waitForEvent(QStringLiteral("lower"), 300).isEmpty());
+            session.send(QStringLiteral("key back"));
+            QCOMPARE(session.waitForEvent(QStringLiteral("lower")).value(QLatin1String("surface")).toInt(), application);
+            QCOMPARE(session.log().count(QLatin1String("e2e: pop")), 1);
+        }
+    }
+
+    // The components on the device: the Back key pops the top page with its statuses in
+    // order, then, with one page left, lowers the window.
+    void backKeyThroughThePageStack()
+    {
+        QList<qint64> pids;
+        {
+            HomeScreenSession session;
+            QVERIFY(session.start(QStringLiteral(PELKAN_E2E_DATA "/pages.qml"), {}));
+            QVERIFY(session.waitForLog(QStringLiteral("e2e: second page active")));
+            QVERIFY(!session.waitFor([](const QJsonObject &r) {
+                return r.value(QLatin1String("event")) == QLatin1String("property") && name(r) == QLatin1String("BACKGROUND_VISIBLE");
+            }).isEmpty());
+            const int application = session.surfaceWith(QStringLiteral("BACKGROUND_VISIBLE"));
+            session.send(QStringLiteral("focus"));
+            QVERIFY(session.waitForLog(QStringLiteral("e2e: active true")));
+
+            session.send(QStringLiteral("key back"));
+            QVERIFY(session.waitForLog(QStringLiteral("e2e: second page inactive")));
+            const QString log = session.log();
+            QVERIFY(log.contains(QLatin1String("e2e: depth 1")));
+            QVERIFY2(log.indexOf(QLatin1String("e2e: second page deactivating")) < log.indexOf(QLatin1String("e2e: second page inactive")),
+                     qPrintable(log.right(400)));
+            session.send(QStringLiteral("key back"));
+            QCOMPARE(session.waitForEvent(QStringLiteral("lower")).value(QLatin1String("surface")).toInt(), application);
+            pids = session.startedPids();
+        }
+        // Everything the session started is gone with it, reaped.
+        for (qint64 pid : qAsConst(pids))
+            QVERIFY2(pid > 0 && ::kill(pid_t(pid), 0) == -1 && errno == ESRCH, qPrintable(QString::number(pid)));
+    }
 
 private:
     static QString application() { return QStringLiteral(PELKAN_E2E_DATA "/application.qml"); }
@@ -56,267 +279,6 @@ bool tst_HomeScreen::privilegedHere()
 {
     const group *privileged = getgrnam("privileged");
     return getuid() == 0 || (privileged && getegid() == privileged->gr_gid);
-}
-
-void tst_HomeScreen::applicationWindowProperties_data()
-{
-    QTest::addColumn<QStringList>("properties");
-    QTest::addColumn<QStringList>("expected");
-    const QStringList common { "BACKGROUND_VISIBLE", "WINID", "QUORVANE_COVER_WINDOW", "QUORVANE_HAVE_COVER" };
-    QTest::newRow("category") << QStringList { "category=true" } << common + QStringList { "CATEGORY", "WINDOW_OPACITY" };
-    QTest::newRow("no category") << QStringList { "category=false" } << common + QStringList { "WINDOW_OPACITY" };
-    QTest::newRow("background rectangle") << QStringList { "category=false", "backgroundHeight=50" }
-                                          << common + QStringList { "WINDOW_OPACITY", "BACKGROUND_RECT" };
-}
-
-void tst_HomeScreen::applicationWindowProperties()
-{
-    QFETCH(QStringList, properties);
-    QFETCH(QStringList, expected);
-    HomeScreenSession session;
-    QVERIFY(run(session, properties));
-
-    const int surface = session.surfaceWith(QStringLiteral("BACKGROUND_VISIBLE"));
-    QVERIFY(session.waitForPropertySequence(surface, expected));
-    // Each publication sends the whole set in the same order; the window may publish
-    // more than once (when shown, when its cover arrives). Other properties of the
-    // window (the cover actions, keeping the cover) come on their own.
-    QStringList published;
-    for (const QJsonObject &record : session.properties(surface)) {
-        if (name(record) != QLatin1String("_APP_COVER_ACTION") && name(record) != QLatin1String("QUORVANE_RETAIN_COVER"))
-            published << name(record);
-    }
-    QCOMPARE(published.size() % expected.size(), 0);
-    for (int i = 0; i < published.size(); i += expected.size())
-        QCOMPARE(published.mid(i, expected.size()), expected);
-
-    const QJsonObject visible = session.lastProperty(surface, QStringLiteral("BACKGROUND_VISIBLE"));
-    QCOMPARE(visible.value(QLatin1String("type")).toString(), QStringLiteral("bool"));
-    QCOMPARE(value(visible), QStringLiteral("true"));
-    QCOMPARE(value(session.lastProperty(surface, QStringLiteral("WINDOW_OPACITY"))), QStringLiteral("1"));
-    QCOMPARE(session.lastProperty(surface, QStringLiteral("WINID")).value(QLatin1String("type")).toString(),
-             QStringLiteral("qulonglong"));
-    if (expected.contains(QLatin1String("CATEGORY")))
-        QCOMPARE(value(session.lastProperty(surface, QStringLiteral("CATEGORY"))), QStringLiteral("pelkan"));
-    if (expected.contains(QLatin1String("BACKGROUND_RECT")))
-        QCOMPARE(value(session.lastProperty(surface, QStringLiteral("BACKGROUND_RECT"))), QStringLiteral("0,10,270,50"));
-}
-
-void tst_HomeScreen::coverWindowPairsWithApplication_data()
-{
-    QTest::addColumn<bool>("category");
-    QTest::addColumn<QStringList>("expected");
-    QTest::newRow("category") << true << QStringList { "TRANSPARENT", "WINID", "CATEGORY", "QUORVANE_COVER_WINDOW",
-                                                       "QUORVANE_APPLICATION_WINDOW" };
-    QTest::newRow("no category") << false << QStringList { "TRANSPARENT", "WINID", "CATEGORY" };
-}
-
-void tst_HomeScreen::coverWindowPairsWithApplication()
-{
-    QFETCH(bool, category);
-    QFETCH(QStringList, expected);
-    HomeScreenSession session;
-    QVERIFY(run(session, { QStringLiteral("category=%1").arg(category ? "true" : "false") }));
-
-    const int application = session.surfaceWith(QStringLiteral("BACKGROUND_VISIBLE"));
-    // The cover's properties arrive together, but not necessarily with its category.
-    QVERIFY(!session.waitFor([](const QJsonObject &r) {
-        return r.value(QLatin1String("event")) == QLatin1String("property") && name(r) == QLatin1String("TRANSPARENT");
-    }).isEmpty());
-    const int cover = session.surfaceWith(QStringLiteral("TRANSPARENT"));
-    QVERIFY(cover != 0 && cover != application);
-
-    // Properties set before the compositor's side of a window exists reach it all at
-    // once, sorted by name, when it is made; the window's own publication keeps order.
-    QVERIFY(session.waitForPropertySequence(cover, expected));
-    QCOMPARE(value(session.lastProperty(cover, QStringLiteral("TRANSPARENT"))), QStringLiteral("true"));
-    QCOMPARE(value(session.lastProperty(cover, QStringLiteral("CATEGORY"))),
-             category ? QStringLiteral("pelkan-cover") : QStringLiteral("cover"));
-
-    // Each window names the other by the id the other published as its own.
-    const QString coverId = value(session.lastProperty(cover, QStringLiteral("WINID")));
-    const QString applicationId = value(session.lastProperty(application, QStringLiteral("WINID")));
-    QVERIFY(!coverId.isEmpty() && coverId != applicationId);
-    QCOMPARE(value(session.lastProperty(application, QStringLiteral("QUORVANE_COVER_WINDOW"))), coverId);
-
-    if (category) {
-        QCOMPARE(value(session.lastProperty(cover, QStringLiteral("QUORVANE_COVER_WINDOW"))), coverId);
-        QCOMPARE(value(session.lastProperty(cover, QStringLiteral("QUORVANE_APPLICATION_WINDOW"))), applicationId);
-        const QJsonObject paired = session.waitForEvent(QStringLiteral("paired"));
-        QCOMPARE(paired.value(QLatin1String("application")).toInt(), application);
-        QCOMPARE(paired.value(QLatin1String("cover")).toInt(), cover);
-    } else {
-        QVERIFY(session.lastProperty(cover, QStringLiteral("QUORVANE_APPLICATION_WINDOW")).isEmpty());
-        QVERIFY(session.waitForEvent(QStringLiteral("paired"), 300).isEmpty());
-    }
-}
-
-void tst_HomeScreen::coverActionsEndToEnd()
-{
-    HomeScreenSession session;
-    QVERIFY(run(session, {}));
-
-    const QJsonObject published = session.waitForEvent(QStringLiteral("coverActions"));
-    const QJsonArray actions = published.value(QLatin1String("actions")).toArray();
-    QCOMPARE(actions.size(), 2);
-    QCOMPARE(published.value(QLatin1String("surface")).toInt(), session.surfaceWith(QStringLiteral("BACKGROUND_VISIBLE")));
-    const QString service = actions.at(0).toObject().value(QLatin1String("service")).toString();
-    QVERIFY(service.startsWith(QLatin1String("org.quorvaneos.coveraction.pid")));
-
-    const QStringList lines = value(session.lastProperty(published.value(QLatin1String("surface")).toInt(),
-                                                         QStringLiteral("_APP_COVER_ACTION"))).split(QLatin1Char('\n'));
-    QCOMPARE(lines, QStringList({ service, "trigger", "0", "image://theme/icon-cover-pause",
-                                  service, "trigger", "1", "image://theme/icon-cover-next", "0" }));
-
-    // The home screen presses the second action: the second action fires, and only it.
-    session.send(QStringLiteral("trigger 1"));
-    const QJsonObject reply = session.waitForEvent(QStringLiteral("triggered"));
-    QCOMPARE(reply.value(QLatin1String("index")).toInt(), 1);
-    if (!privilegedHere()) {
-        QCOMPARE(reply.value(QLatin1String("error")).toString(), QStringLiteral("org.freedesktop.DBus.Error.AccessDenied"));
-        QCOMPARE(reply.value(QLatin1String("message")).toString(),
-                 QStringLiteral("PID %1 is not in privileged group").arg(session.homeScreenPid()));
-        QSKIP("the home screen is not privileged here: presses are refused, as they must be");
-    }
-    QCOMPARE(reply.value(QLatin1String("error")).toString(), QString());
-    QVERIFY(session.waitForLog(QStringLiteral("e2e: action 1")));
-    QVERIFY(!session.log().contains(QLatin1String("e2e: action 0")));
-
-    // The first action switches the list off: its entries leave the window.
-    session.send(QStringLiteral("trigger 0"));
-    QVERIFY(session.waitForLog(QStringLiteral("e2e: action 0")));
-    const QJsonObject emptied = session.waitForEvent(QStringLiteral("coverActions"));
-    QCOMPARE(emptied.value(QLatin1String("actions")).toArray().size(), 0);
-    QVERIFY(!emptied.contains(QLatin1String("error")));
-}
-
-void tst_HomeScreen::twoActionListsOnOneWindow_data()
-{
-    QTest::addColumn<int>("press");
-    QTest::addColumn<bool>("secondStaysOnBus");
-    QTest::newRow("second list emptied") << 0 << true;
-    QTest::newRow("second list destroyed") << 1 << false;
-}
-
-// The window shows the list enabled last; when it empties or goes, the first one's
-// buttons come back, and a destroyed list's bus name goes with it.
-void tst_HomeScreen::twoActionListsOnOneWindow()
-{
-    QFETCH(int, press);
-    QFETCH(bool, secondStaysOnBus);
-    if (!privilegedHere())
-        QSKIP("the home screen must be privileged to press cover actions");
-    HomeScreenSession session;
-    QVERIFY(run(session, { QStringLiteral("lists=2") }));
-    auto shownService = [](const QJsonObject &published) {
-        return published.value(QLatin1String("actions")).toArray().at(0).toObject().value(QLatin1String("service")).toString();
-    };
-    auto showing = [&shownService](const char *id) {
-        return [&shownService, id](const QJsonObject &r) {
-            return r.value(QLatin1String("event")) == QLatin1String("coverActions") && shownService(r).endsWith(QLatin1String(id));
-        };
-    };
-    const QString second = shownService(session.waitFor(showing(".id2")));
-    QVERIFY(!second.isEmpty());
-
-    session.send(QStringLiteral("trigger %1").arg(press));
-    const QJsonObject reply = session.waitForEvent(QStringLiteral("triggered"));
-    QCOMPARE(reply.value(QLatin1String("service")).toString(), second);
-    QCOMPARE(reply.value(QLatin1String("error")).toString(), QString());
-    // Straight from one list's buttons to the other's, with no empty set between.
-    const QJsonObject shown = session.waitForEvent(QStringLiteral("coverActions"));
-    QVERIFY2(shownService(shown).endsWith(QLatin1String(".id1")), qPrintable(QJsonDocument(shown).toJson()));
-    QCOMPARE(shown.value(QLatin1String("actions")).toArray().size(), 2);
-
-    session.send(QStringLiteral("names"));
-    const QJsonArray names = session.waitForEvent(QStringLiteral("names")).value(QLatin1String("names")).toArray();
-    QCOMPARE(names.contains(second), secondStaysOnBus);
-    QCOMPARE(names.size(), secondStaysOnBus ? 2 : 1);
-}
-
-void tst_HomeScreen::coverStatusFromHomeScreen()
-{
-    HomeScreenSession session;
-    QVERIFY(run(session, {}));
-    // Let the application's bus connection settle before the signal goes out.
-    QVERIFY(!session.waitForEvent(QStringLiteral("coverActions")).isEmpty());
-
-    session.send(QStringLiteral("coverstatus 7"));
-    session.send(QStringLiteral("coverstatus 2"));
-    QVERIFY(session.waitForLog(QStringLiteral("e2e: cover status 2")));
-    QVERIFY(!session.log().contains(QLatin1String("e2e: cover status 7")));
-}
-
-void tst_HomeScreen::backKey_data()
-{
-    QTest::addColumn<int>("depth");
-    QTest::addColumn<bool>("lowers");
-    QTest::newRow("one page") << 1 << true;
-    QTest::newRow("two pages") << 2 << false;
-}
-
-void tst_HomeScreen::backKey()
-{
-    QFETCH(int, depth);
-    QFETCH(bool, lowers);
-    HomeScreenSession session;
-    QVERIFY(run(session, { QStringLiteral("depth=%1").arg(depth) }));
-    const int application = session.surfaceWith(QStringLiteral("BACKGROUND_VISIBLE"));
-    session.send(QStringLiteral("focus"));
-    QVERIFY(session.waitForLog(QStringLiteral("e2e: active true")));
-
-    session.send(QStringLiteral("key back"));
-    QCOMPARE(session.waitForEvent(QStringLiteral("keySent")).value(QLatin1String("surface")).toInt(), application);
-    if (lowers) {
-        QCOMPARE(session.waitForEvent(QStringLiteral("lower")).value(QLatin1String("surface")).toInt(), application);
-        QVERIFY(!session.log().contains(QLatin1String("e2e: pop")));
-    } else {
-        QVERIFY(session.waitForLog(QStringLiteral("e2e: pop from depth 2")));
-        // Now one page is left: the next Back lowers the window.
-        QVERIFY(session.waitForEvent(QStringLiteral("lower"), 300).isEmpty());
-        session.send(QStringLiteral("key back"));
-        QCOMPARE(session.waitForEvent(QStringLiteral("lower")).value(QLatin1String("surface")).toInt(), application);
-        QCOMPARE(session.log().count(QLatin1String("e2e: pop")), 1);
-    }
-}
-
-// The components on the device: the Back key pops the top page with its statuses in
-// order, then, with one page left, lowers the window.
-void tst_HomeScreen::backKeyThroughThePageStack()
-{
-    HomeScreenSession session;
-    QVERIFY(session.start(QStringLiteral(PELKAN_E2E_DATA "/pages.qml"), {}));
-    QVERIFY(session.waitForLog(QStringLiteral("e2e: second page active")));
-    QVERIFY(!session.waitFor([](const QJsonObject &r) {
-        return r.value(QLatin1String("event")) == QLatin1String("property") && name(r) == QLatin1String("BACKGROUND_VISIBLE");
-    }).isEmpty());
-    const int application = session.surfaceWith(QStringLiteral("BACKGROUND_VISIBLE"));
-    session.send(QStringLiteral("focus"));
-    QVERIFY(session.waitForLog(QStringLiteral("e2e: active true")));
-
-    session.send(QStringLiteral("key back"));
-    QVERIFY(session.waitForLog(QStringLiteral("e2e: second page inactive")));
-    const QString log = session.log();
-    QVERIFY(log.contains(QLatin1String("e2e: depth 1")));
-    QVERIFY2(log.indexOf(QLatin1String("e2e: second page deactivating")) < log.indexOf(QLatin1String("e2e: second page inactive")),
-             qPrintable(log.right(400)));
-    session.send(QStringLiteral("key back"));
-    QCOMPARE(session.waitForEvent(QStringLiteral("lower")).value(QLatin1String("surface")).toInt(), application);
-}
-
-void tst_HomeScreen::leavesNoProcessBehind()
-{
-    QList<qint64> pids;
-    {
-        HomeScreenSession session;
-        QVERIFY(run(session, {}));
-        pids = session.startedPids();
-    }
-    for (qint64 pid : qAsConst(pids)) {
-        QVERIFY(pid > 0);
-        // Reaped children are gone from the process table.
-        QVERIFY2(::kill(pid_t(pid), 0) == -1 && errno == ESRCH, qPrintable(QString::number(pid)));
-    }
 }
 
 QTEST_GUILESS_MAIN(tst_HomeScreen)

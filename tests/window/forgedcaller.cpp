@@ -1,7 +1,8 @@
-// A caller that connects to the bus as an ordinary user and then makes the process behind
-// its connection look privileged, the two ways an attacker would, before pressing cover
-// action 0 on the connection it made as itself.
+// A caller that presses a cover action at once (plain, action <index>, default 0), or
+// connects as an ordinary user and presses action 0 after making the process behind its
+// connection look privileged, the two ways an attacker would.
 //
+//   forgedcaller plain    <bus> <service> <path> <result-file> [index]
 //   forgedcaller setuid   <bus> <service> <path> <result-file> <blocking set-uid program>
 //       Forks. The parent executes the set-uid program; the child waits until its parent's
 //       /proc entry is root's and calls.
@@ -44,10 +45,9 @@ bool waitForRootOwner(pid_t pid)
     return false;
 }
 
-std::string pressAction(DBusConnection *connection, const char *service, const char *path)
+std::string pressAction(DBusConnection *connection, const char *service, const char *path, dbus_int32_t index = 0)
 {
     DBusMessage *call = dbus_message_new_method_call(service, path, "org.quorvaneos.pelkan.coveraction", "trigger");
-    dbus_int32_t index = 0;
     dbus_message_append_args(call, DBUS_TYPE_INT32, &index, DBUS_TYPE_INVALID);
     DBusError error;
     dbus_error_init(&error);
@@ -68,8 +68,9 @@ int main(int argc, char **argv)
 {
     const bool setuid = argc == 7 && std::strcmp(argv[1], "setuid") == 0;
     const bool reuse = argc == 6 && std::strcmp(argv[1], "pidreuse") == 0;
-    if (!setuid && !reuse) {
-        std::fprintf(stderr, "usage: %s setuid|pidreuse bus service path result-file [program]\n", argv[0]);
+    const bool plain = (argc == 6 || argc == 7) && std::strcmp(argv[1], "plain") == 0;
+    if (!setuid && !reuse && !plain) {
+        std::fprintf(stderr, "usage: %s plain|setuid|pidreuse bus service path result-file [index|program]\n", argv[0]);
         return 2;
     }
     DBusError error;
@@ -80,6 +81,10 @@ int main(int argc, char **argv)
         return 1;
     }
     const std::string result = argv[5];
+    if (plain) {
+        writeFile(result, pressAction(connection, argv[3], argv[4], argc == 7 ? std::atoi(argv[6]) : 0));
+        return 0;
+    }
     const pid_t opener = ::getpid();
     const pid_t child = ::fork();
     if (child < 0)

@@ -42,53 +42,341 @@ class tst_DeclarativeWindow : public QObject
     Q_OBJECT
 
 private Q_SLOTS:
-    void init();
-    void cleanup();
-    void cleanupTestCase();
+    void init()
+    {
+        QVERIFY(ConfigFixture::reset(AngleKey));
+        QVERIFY(ConfigFixture::reset(AllowedKey));
+        m_published.clear();
+    }
 
-    void selectOrientation_data();
-    void selectOrientation();
-    void orientationFollowsDeviceAndAllowed();
-    void invalidOrientationsAreRefused_data();
-    void invalidOrientationsAreRefused();
-    void pageOrientationFollowsUntilSet();
-    void defaultAllowedOrientations_data();
-    void defaultAllowedOrientations();
-    void screenRotation();
-    void observersSeeMouseEvents();
-    void observersSeeTouchEvents();
-    void observersSeeGrabLoss();
-    void leavingTheWindowWarnsOnlyForATree();
-    void offWaylandOnlyTheColour();
-    void nothingWithoutANativeHandle();
-    void coverAttachAndDestroy();
-    void queuedDeletionWaitsForAFrame();
+    void cleanup()
+    {
+        WindowPropertyPublisher::setSinkForTesting({});
+        m_window.reset();
+    }
+
+    void cleanupTestCase()
+    {
+        ConfigFixture::reset(AngleKey);
+        ConfigFixture::reset(AllowedKey);
+        ConfigFixture::reset(DiagonalKey);
+    }
+
+    void selectOrientation_data()
+    {
+        QTest::addColumn<int>("allowed");
+        QTest::addColumn<int>("device");
+        QTest::addColumn<int>("current");
+        QTest::addColumn<int>("expected");
+        QTest::newRow("device allowed") << int(O::All) << int(O::Landscape) << int(O::Portrait) << int(O::Landscape);
+        QTest::newRow("landscape|inverted portrait, device portrait") << 6 << int(O::Portrait) << int(O::Portrait) << int(O::Landscape);
+        QTest::newRow("inverted portrait only, device landscape") << int(O::PortraitInverted) << int(O::Landscape) << int(O::Portrait) << int(O::PortraitInverted);
+        QTest::newRow("device disallowed keeps current") << int(O::Portrait | O::Landscape) << int(O::LandscapeInverted) << int(O::Landscape) << int(O::Landscape);
+        QTest::newRow("inverted landscape before inverted portrait") << int(O::PortraitInverted | O::LandscapeInverted) << int(O::Portrait) << int(O::Portrait) << int(O::LandscapeInverted);
+        QTest::newRow("nothing allowed") << 0 << int(O::Portrait) << int(O::Portrait) << 0;
+        QTest::newRow("no orientation bits") << 16 << int(O::Portrait) << int(O::Portrait) << 0;
+    }
+
+    void selectOrientation()
+    {
+        QFETCH(int, allowed);
+        QFETCH(int, device);
+        QFETCH(int, current);
+        QFETCH(int, expected);
+        DeclarativeWindow window;
+        window.setAllowedOrientations(O::All);
+        window.setDeviceOrientation(O::Orientation(current));
+        QCOMPARE(int(window.orientation()), current);
+        QCOMPARE(window._selectOrientation(allowed, device), expected);
+    }
+
+    // The window turns with the device within what is allowed and not while locked; the
+    // page orientation follows it until a page sets its own.
+    void orientationFollowsDevice()
+    {
+        DeclarativeWindow window;
+        window.setDeviceOrientation(O::Portrait);
+        window.setAllowedOrientations(O::Portrait | O::Landscape);
+        QCOMPARE(window.orientation(), O::Portrait);
+        QSignalSpy changed(&window, &DeclarativeWindow::orientationChanged);
+        QSignalSpy pageChanged(&window, &DeclarativeWindow::pageOrientationChanged);
+
+        window.setDeviceOrientation(O::LandscapeInverted);
+        QCOMPARE(window.orientation(), O::Portrait);
+        window.setDeviceOrientation(O::Landscape);
+        QCOMPARE(window.orientation(), O::Landscape);
+        QCOMPARE(window.pageOrientation(), O::Landscape);
+        QCOMPARE(changed.count(), 1);
+        QCOMPARE(pageChanged.count(), 1);
+
+        window.setPageOrientation(O::PortraitInverted);
+        window.setDeviceOrientation(O::Portrait);
+        QCOMPARE(window.pageOrientation(), O::PortraitInverted);
+        QCOMPARE(pageChanged.count(), 2);
+        window.resetPageOrientation();
+        QCOMPARE(window.pageOrientation(), O::Portrait);
+        QCOMPARE(pageChanged.count(), 3);
+
+        window.setDeviceOrientation(O::Landscape);
+        window.setOrientationLocked(true);
+        window.setDeviceOrientation(O::Portrait);
+        window.setAllowedOrientations(O::Portrait);
+        QCOMPARE(window.orientation(), O::Landscape);
+        QCOMPARE(changed.count(), 3);
+        // Unlocking applies what happened meanwhile.
+        window.setOrientationLocked(false);
+        QCOMPARE(window.orientation(), O::Portrait);
+        QCOMPARE(changed.count(), 4);
+    }
+
+    void invalidOrientationsAreRefused_data()
+    {
+        QTest::addColumn<QByteArray>("property");
+        QTest::addColumn<int>("value");
+        QTest::addColumn<QString>("warning");
+        QTest::newRow("no allowed orientation") << QByteArray("_allowedOrientations") << 0 << "Invalid allowedOrientations value: 0";
+        QTest::newRow("device facing two ways") << QByteArray("deviceOrientation") << 5 << "Invalid deviceOrientation value: 5";
+        QTest::newRow("device facing nowhere") << QByteArray("deviceOrientation") << 0 << "Invalid deviceOrientation value: 0";
+        QTest::newRow("device past the four") << QByteArray("deviceOrientation") << 16 << "Invalid deviceOrientation value: 10";
+    }
+
+    void invalidOrientationsAreRefused()
+    {
+        QFETCH(QByteArray, property);
+        QFETCH(int, value);
+        QFETCH(QString, warning);
+        DeclarativeWindow window;
+        window.setAllowedOrientations(O::Landscape | O::Portrait);
+        window.setDeviceOrientation(O::Landscape);
+        QSignalSpy allowedChanged(&window, &DeclarativeWindow::_allowedOrientationsChanged);
+        QSignalSpy deviceChanged(&window, &DeclarativeWindow::deviceOrientationChanged);
+        QTest::ignoreMessage(QtWarningMsg, qPrintable(warning));
+        QVERIFY(window.setProperty(property, value));
+        QCOMPARE(window.allowedOrientations(), O::Landscape | O::Portrait);
+        QCOMPARE(window.deviceOrientation(), O::Landscape);
+        QCOMPARE(window.orientation(), O::Landscape);
+        QCOMPARE(allowedChanged.count() + deviceChanged.count(), 0);
+    }
+
+    void defaultAllowedOrientations_data()
+    {
+        QTest::addColumn<double>("diagonal");
+        QTest::addColumn<QString>("configured");
+        QTest::addColumn<int>("expected");
+        QTest::addColumn<bool>("warns");
+        QTest::newRow("phone") << 5.0 << "" << 11 << false;
+        QTest::newRow("tablet") << 10.0 << "" << 15 << false;
+        QTest::newRow("phone, configured 5") << 5.0 << "5" << 5 << false;
+        QTest::newRow("phone, 16 rejected") << 5.0 << "16" << 11 << true;
+        QTest::newRow("tablet, 0 rejected") << 10.0 << "0" << 15 << true;
+        QTest::newRow("phone, text rejected") << 5.0 << "'all'" << 11 << true;
+        QTest::newRow("phone, boolean rejected") << 5.0 << "true" << 11 << true;
+        QTest::newRow("phone, 2^32 + 1 not cut to 1") << 5.0 << "int64 4294967297" << 11 << true;
+    }
+
+    void defaultAllowedOrientations()
+    {
+        QFETCH(double, diagonal);
+        QFETCH(QString, configured);
+        QFETCH(int, expected);
+        QFETCH(bool, warns);
+
+        QVERIFY(ConfigFixture::write(DiagonalKey, QString::number(diagonal, 'f', 1)));
+        QTRY_COMPARE(Pelkan::Screen::instance()->diagonal(), diagonal);
+        if (!configured.isEmpty())
+            QVERIFY(ConfigFixture::write(AllowedKey, configured));
+        if (warns) {
+            QTest::ignoreMessage(QtWarningMsg, QRegularExpression(QStringLiteral(
+                    "^Invalid default allowed orientations defined. Check your device configuration! Defaulting to:")));
+        }
+        DeclarativeWindow window;
+        QCOMPARE(int(window.defaultAllowedOrientations()), expected);
+    }
+
+    void screenRotation()
+    {
+        QVERIFY(ConfigFixture::write(AngleKey, QStringLiteral("270")));
+        QCOMPARE(DeclarativeWindow().screenRotation(), 270);
+
+        QVERIFY(ConfigFixture::write(AngleKey, QStringLiteral("45")));
+        QTest::ignoreMessage(QtWarningMsg, "Invalid screenOrientation angle configured: 45");
+        QCOMPARE(DeclarativeWindow().screenRotation(), 270);
+
+        QVERIFY(ConfigFixture::write(AngleKey, QStringLiteral("-90")));
+        QCOMPARE(DeclarativeWindow().screenRotation(), -90);
+        QVERIFY(ConfigFixture::write(AngleKey, QStringLiteral("0")));
+        QCOMPARE(DeclarativeWindow().screenRotation(), 0);
+    }
+
+    // Observers see every mouse and touch event and the loss of a grab, once however often
+    // they registered, and consume nothing.
+    void observersSeeEveryEventOnce()
+    {
+        DeclarativeWindow *window = showWindow();
+        QVERIFY(window);
+        auto target = new PressTarget(window);
+        target->setSize(window->size());
+        auto thief = new QQuickItem(window);
+        RecordingObserver observer;
+        window->registerObserver(&observer);
+        window->registerObserver(&observer);
+        const auto unregister = qScopeGuard([&] { window->unregisterObserver(&observer); });
+
+        QTest::mousePress(m_window.data(), Qt::LeftButton, {}, QPoint(50, 50));
+        QTest::mouseMove(m_window.data(), QPoint(60, 80));
+        QTest::mouseRelease(m_window.data(), Qt::LeftButton, {}, QPoint(60, 80));
+        // (Qt may add a move of its own before the press.)
+        QCOMPARE(observer.count(QEvent::MouseButtonPress), 1);
+        QCOMPARE(observer.count(QEvent::MouseButtonRelease), 1);
+        QVERIFY(observer.types.indexOf(QEvent::MouseMove, observer.types.indexOf(QEvent::MouseButtonPress)) > 0);
+        QCOMPARE(target->presses, 1);
+
+        QTest::mousePress(m_window.data(), Qt::LeftButton, {}, QPoint(50, 50));
+        QCOMPARE(m_window->mouseGrabberItem(), target);
+        const int ungrabs = observer.count(QEvent::UngrabMouse);
+        thief->grabMouse();
+        QCOMPARE(observer.count(QEvent::UngrabMouse), ungrabs + 1);
+        QTest::mouseRelease(m_window.data(), Qt::LeftButton, {}, QPoint(50, 50));
+
+        QTouchDevice *device = QTest::createTouchDevice();
+        QTest::touchEvent(m_window.data(), device).press(0, QPoint(40, 40));
+        QTest::touchEvent(m_window.data(), device).move(0, QPoint(40, 90));
+        QTest::touchEvent(m_window.data(), device).release(0, QPoint(40, 90));
+        QCOMPARE(observer.count(QEvent::TouchBegin), 1);
+        QCOMPARE(observer.count(QEvent::TouchUpdate), 1);
+        QCOMPARE(observer.count(QEvent::TouchEnd), 1);
+
+        window->unregisterObserver(&observer);
+        observer.types.clear();
+        QTest::mouseClick(m_window.data(), Qt::LeftButton, {}, QPoint(50, 50));
+        QVERIFY(observer.types.isEmpty());
+        QCOMPARE(target->presses, 4); // the touch reached it as a press too
+    }
+
+    void leavingTheWindowWarnsOnlyForATree()
+    {
+        DeclarativeWindow *window = showWindow();
+        QVERIFY(window);
+        QQuickItem holder(m_window->contentItem());
+        window->setParentItem(&holder);
+        QTest::ignoreMessage(QtWarningMsg, "DeclarativeWindow::Item does not belong to a window");
+        holder.setParentItem(nullptr);
+        QVERIFY(!window->window());
+
+        // Torn down or detached on purpose: no parent, nothing to say.
+        window->setParentItem(m_window->contentItem());
+        static int warnings;
+        warnings = 0;
+        QtMessageHandler previous = qInstallMessageHandler([](QtMsgType type, const QMessageLogContext &, const QString &) {
+            if (type == QtWarningMsg)
+                ++warnings;
+        });
+        window->setParentItem(nullptr);
+        delete window;
+        qInstallMessageHandler(previous);
+        QCOMPARE(warnings, 0);
+    }
+
+    // Off wayland, and on it for a window without a native handle, nothing is published.
+    void nothingPublishedOffWaylandOrWithoutAHandle()
+    {
+        record(QStringLiteral("wayland"));
+        QQuickWindow hidden;
+        DeclarativeWindow unshown(hidden.contentItem());
+        unshown.setPublishCategory(true);
+        unshown.setBackgroundRect(QRectF(0, 10, 100, 50));
+        QVERIFY(m_published.isEmpty());
+
+        record(QString());
+        DeclarativeWindow *window = showWindow();
+        QVERIFY(window);
+        QCOMPARE(QGuiApplication::platformName(), QStringLiteral("xcb"));
+        window->setPublishCategory(true);
+        window->setBackgroundVisible(false);
+        window->setBackgroundRect(QRectF(0, 0, 10, 10));
+        auto cover = new QWindow;
+        window->_setCover(cover);
+        delete cover;
+        QVERIFY(m_published.isEmpty());
+
+        // The colour is the window's own, not a compositor property: it applies everywhere,
+        // also when declared before the item has a window.
+        window->setParentItem(nullptr);
+        window->setBackgroundColor(QColor(Qt::darkCyan));
+        window->setParentItem(m_window->contentItem());
+        QCOMPARE(m_window->color(), QColor(Qt::darkCyan));
+        QCOMPARE(window->backgroundColor(), QColor(Qt::darkCyan));
+    }
+
+    void coverAttachAndDestroy()
+    {
+        record(QStringLiteral("wayland"));
+        DeclarativeWindow *window = showWindow();
+        QVERIFY(window);
+        QSignalSpy switcher(window, &DeclarativeWindow::switcherWindowChanged);
+        auto cover = new QQuickWindow;
+
+        m_published.clear();
+        window->_setCover(cover);
+        QCOMPARE(m_published.first().name, QStringLiteral("QUORVANE_RETAIN_COVER"));
+        QCOMPARE(m_published.first().value, QVariant(true));
+        QCOMPARE(m_published.at(3).name, QStringLiteral("QUORVANE_COVER_WINDOW"));
+        QCOMPARE(m_published.at(3).value.toULongLong(), qulonglong(cover->winId()));
+        // The home screen is told there is a cover with the same publication.
+        QCOMPARE(m_published.at(4).name, QStringLiteral("QUORVANE_HAVE_COVER"));
+        QCOMPARE(m_published.at(4).value, QVariant(true));
+        QCOMPARE(switcher.count(), 1);
+        QCOMPARE(switcher.last().first().value<QQuickWindow *>(), cover);
+
+        // The application is in the foreground: its cover is not on show until it leaves.
+        QVERIFY(!window->coverVisible());
+        m_window->hide();
+        QVERIFY(window->coverVisible());
+        window->setCoverIsPrimaryWindow(true);
+        m_window->show();
+        QVERIFY(window->coverVisible());
+
+        m_published.clear();
+        delete cover;
+        QVERIFY(!window->coverWindow());
+        QCOMPARE(m_published.first().name, QStringLiteral("QUORVANE_RETAIN_COVER"));
+        QCOMPARE(m_published.first().value, QVariant(false));
+        QCOMPARE(m_published.at(4).value, QVariant(false));
+        QVERIFY(!window->haveCoverHint());
+        QVERIFY(!window->coverVisible());
+        QCOMPARE(switcher.count(), 2);
+    }
+
+    void queuedDeletionWaitsForAFrame()
+    {
+        DeclarativeWindow *window = showWindow();
+        QVERIFY(window);
+        auto item = new QQuickItem(window);
+        QPointer<QQuickItem> guard(item);
+        item->setParentItem(nullptr);
+        window->queueDeletion(item);
+        QVERIFY(guard);
+        QTRY_VERIFY(guard.isNull());
+
+        // Outside a window there is no frame to wait for.
+        DeclarativeWindow loose;
+        auto object = new QObject;
+        QPointer<QObject> looseGuard(object);
+        loose.queueDeletion(object);
+        QTRY_VERIFY(looseGuard.isNull());
+    }
 
 private:
     DeclarativeWindow *showWindow();
+    void record(const QString &platform)
+    {
+        WindowPropertyPublisher::setSinkForTesting([this](QWindow *, const QString &name, const QVariant &value) {
+            m_published.append({ name, value });
+        }, platform);
+    }
     QScopedPointer<QQuickWindow> m_window;
     QVector<PublishedProperty> m_published;
 };
-
-void tst_DeclarativeWindow::init()
-{
-    QVERIFY(ConfigFixture::reset(AngleKey));
-    QVERIFY(ConfigFixture::reset(AllowedKey));
-    m_published.clear();
-}
-
-void tst_DeclarativeWindow::cleanup()
-{
-    WindowPropertyPublisher::setSinkForTesting({});
-    m_window.reset();
-}
-
-void tst_DeclarativeWindow::cleanupTestCase()
-{
-    ConfigFixture::reset(AngleKey);
-    ConfigFixture::reset(AllowedKey);
-    ConfigFixture::reset(DiagonalKey);
-}
 
 DeclarativeWindow *tst_DeclarativeWindow::showWindow()
 {
@@ -100,341 +388,6 @@ DeclarativeWindow *tst_DeclarativeWindow::showWindow()
     if (!QTest::qWaitForWindowExposed(m_window.data()))
         return nullptr;
     return item;
-}
-
-void tst_DeclarativeWindow::selectOrientation_data()
-{
-    QTest::addColumn<int>("allowed");
-    QTest::addColumn<int>("device");
-    QTest::addColumn<int>("current");
-    QTest::addColumn<int>("expected");
-    QTest::newRow("device allowed") << int(O::All) << int(O::Landscape) << int(O::Portrait) << int(O::Landscape);
-    QTest::newRow("landscape|inverted portrait, device portrait") << 6 << int(O::Portrait) << int(O::Portrait) << int(O::Landscape);
-    QTest::newRow("inverted portrait only, device landscape") << int(O::PortraitInverted) << int(O::Landscape) << int(O::Portrait) << int(O::PortraitInverted);
-    QTest::newRow("device disallowed keeps current") << int(O::Portrait | O::Landscape) << int(O::LandscapeInverted) << int(O::Landscape) << int(O::Landscape);
-    QTest::newRow("inverted landscape before inverted portrait") << int(O::PortraitInverted | O::LandscapeInverted) << int(O::Portrait) << int(O::Portrait) << int(O::LandscapeInverted);
-    QTest::newRow("nothing allowed") << 0 << int(O::Portrait) << int(O::Portrait) << 0;
-    QTest::newRow("no orientation bits") << 16 << int(O::Portrait) << int(O::Portrait) << 0;
-}
-
-void tst_DeclarativeWindow::selectOrientation()
-{
-    QFETCH(int, allowed);
-    QFETCH(int, device);
-    QFETCH(int, current);
-    QFETCH(int, expected);
-    DeclarativeWindow window;
-    window.setAllowedOrientations(O::All);
-    window.setDeviceOrientation(O::Orientation(current));
-    QCOMPARE(int(window.orientation()), current);
-    QCOMPARE(window._selectOrientation(allowed, device), expected);
-}
-
-void tst_DeclarativeWindow::orientationFollowsDeviceAndAllowed()
-{
-    DeclarativeWindow window;
-    window.setDeviceOrientation(O::Portrait);
-    window.setAllowedOrientations(O::Portrait | O::Landscape);
-    QCOMPARE(window.orientation(), O::Portrait);
-    QSignalSpy changed(&window, &DeclarativeWindow::orientationChanged);
-
-    window.setDeviceOrientation(O::LandscapeInverted);
-    QCOMPARE(window.orientation(), O::Portrait);
-    window.setDeviceOrientation(O::Landscape);
-    QCOMPARE(window.orientation(), O::Landscape);
-    QCOMPARE(changed.count(), 1);
-
-    window.setOrientationLocked(true);
-    window.setDeviceOrientation(O::Portrait);
-    window.setAllowedOrientations(O::Portrait);
-    QCOMPARE(window.orientation(), O::Landscape);
-    QCOMPARE(changed.count(), 1);
-
-    // Unlocking applies what happened meanwhile.
-    window.setOrientationLocked(false);
-    QCOMPARE(window.orientation(), O::Portrait);
-    QCOMPARE(changed.count(), 2);
-}
-
-void tst_DeclarativeWindow::invalidOrientationsAreRefused_data()
-{
-    QTest::addColumn<QByteArray>("property");
-    QTest::addColumn<int>("value");
-    QTest::addColumn<QString>("warning");
-    QTest::newRow("no allowed orientation") << QByteArray("_allowedOrientations") << 0 << "Invalid allowedOrientations value: 0";
-    QTest::newRow("device facing two ways") << QByteArray("deviceOrientation") << 5 << "Invalid deviceOrientation value: 5";
-    QTest::newRow("device facing nowhere") << QByteArray("deviceOrientation") << 0 << "Invalid deviceOrientation value: 0";
-    QTest::newRow("device past the four") << QByteArray("deviceOrientation") << 16 << "Invalid deviceOrientation value: 10";
-}
-
-void tst_DeclarativeWindow::invalidOrientationsAreRefused()
-{
-    QFETCH(QByteArray, property);
-    QFETCH(int, value);
-    QFETCH(QString, warning);
-    DeclarativeWindow window;
-    window.setAllowedOrientations(O::Landscape | O::Portrait);
-    window.setDeviceOrientation(O::Landscape);
-    QSignalSpy allowedChanged(&window, &DeclarativeWindow::_allowedOrientationsChanged);
-    QSignalSpy deviceChanged(&window, &DeclarativeWindow::deviceOrientationChanged);
-    QTest::ignoreMessage(QtWarningMsg, qPrintable(warning));
-    QVERIFY(window.setProperty(property, value));
-    QCOMPARE(window.allowedOrientations(), O::Landscape | O::Portrait);
-    QCOMPARE(window.deviceOrientation(), O::Landscape);
-    QCOMPARE(window.orientation(), O::Landscape);
-    QCOMPARE(allowedChanged.count() + deviceChanged.count(), 0);
-}
-
-void tst_DeclarativeWindow::pageOrientationFollowsUntilSet()
-{
-    DeclarativeWindow window;
-    window.setDeviceOrientation(O::Portrait);
-    QSignalSpy changed(&window, &DeclarativeWindow::pageOrientationChanged);
-    window.setDeviceOrientation(O::Landscape);
-    QCOMPARE(window.pageOrientation(), O::Landscape);
-    QCOMPARE(changed.count(), 1);
-
-    window.setPageOrientation(O::Portrait);
-    window.setDeviceOrientation(O::LandscapeInverted);
-    QCOMPARE(window.pageOrientation(), O::Portrait);
-    QCOMPARE(changed.count(), 2);
-
-    window.resetPageOrientation();
-    QCOMPARE(window.pageOrientation(), O::LandscapeInverted);
-    QCOMPARE(changed.count(), 3);
-}
-
-void tst_DeclarativeWindow::defaultAllowedOrientations_data()
-{
-    QTest::addColumn<double>("diagonal");
-    QTest::addColumn<QString>("configured");
-    QTest::addColumn<int>("expected");
-    QTest::addColumn<bool>("warns");
-    QTest::newRow("phone") << 5.0 << "" << 11 << false;
-    QTest::newRow("tablet") << 10.0 << "" << 15 << false;
-    QTest::newRow("phone, configured 5") << 5.0 << "5" << 5 << false;
-    QTest::newRow("phone, 16 rejected") << 5.0 << "16" << 11 << true;
-    QTest::newRow("tablet, 0 rejected") << 10.0 << "0" << 15 << true;
-    QTest::newRow("phone, text rejected") << 5.0 << "'all'" << 11 << true;
-    QTest::newRow("phone, boolean rejected") << 5.0 << "true" << 11 << true;
-    QTest::newRow("phone, 2^32 + 1 not cut to 1") << 5.0 << "int64 4294967297" << 11 << true;
-}
-
-void tst_DeclarativeWindow::defaultAllowedOrientations()
-{
-    QFETCH(double, diagonal);
-    QFETCH(QString, configured);
-    QFETCH(int, expected);
-    QFETCH(bool, warns);
-
-    QVERIFY(ConfigFixture::write(DiagonalKey, QString::number(diagonal, 'f', 1)));
-    QTRY_COMPARE(Pelkan::Screen::instance()->diagonal(), diagonal);
-    if (!configured.isEmpty())
-        QVERIFY(ConfigFixture::write(AllowedKey, configured));
-    if (warns) {
-        QTest::ignoreMessage(QtWarningMsg, QRegularExpression(QStringLiteral(
-                "^Invalid default allowed orientations defined. Check your device configuration! Defaulting to:")));
-    }
-    DeclarativeWindow window;
-    QCOMPARE(int(window.defaultAllowedOrientations()), expected);
-}
-
-void tst_DeclarativeWindow::screenRotation()
-{
-    QVERIFY(ConfigFixture::write(AngleKey, QStringLiteral("270")));
-    QCOMPARE(DeclarativeWindow().screenRotation(), 270);
-
-    QVERIFY(ConfigFixture::write(AngleKey, QStringLiteral("45")));
-    QTest::ignoreMessage(QtWarningMsg, "Invalid screenOrientation angle configured: 45");
-    QCOMPARE(DeclarativeWindow().screenRotation(), 270);
-
-    QVERIFY(ConfigFixture::write(AngleKey, QStringLiteral("-90")));
-    QCOMPARE(DeclarativeWindow().screenRotation(), -90);
-    QVERIFY(ConfigFixture::write(AngleKey, QStringLiteral("0")));
-    QCOMPARE(DeclarativeWindow().screenRotation(), 0);
-}
-
-void tst_DeclarativeWindow::observersSeeMouseEvents()
-{
-    DeclarativeWindow *window = showWindow();
-    QVERIFY(window);
-    auto target = new PressTarget(window);
-    target->setSize(window->size());
-    RecordingObserver observer;
-    window->registerObserver(&observer);
-    window->registerObserver(&observer);
-
-    QTest::mousePress(m_window.data(), Qt::LeftButton, {}, QPoint(50, 50));
-    QTest::mouseMove(m_window.data(), QPoint(60, 80));
-    QTest::mouseRelease(m_window.data(), Qt::LeftButton, {}, QPoint(60, 80));
-    // Registered twice, delivered once. (Qt may add a move of its own before the press.)
-    QCOMPARE(observer.count(QEvent::MouseButtonPress), 1);
-    QCOMPARE(observer.count(QEvent::MouseButtonRelease), 1);
-    QVERIFY(observer.types.indexOf(QEvent::MouseMove, observer.types.indexOf(QEvent::MouseButtonPress)) > 0);
-    // Observing consumed nothing: the item under the pointer got its press.
-    QCOMPARE(target->presses, 1);
-
-    window->unregisterObserver(&observer);
-    observer.types.clear();
-    QTest::mouseClick(m_window.data(), Qt::LeftButton, {}, QPoint(50, 50));
-    QVERIFY(observer.types.isEmpty());
-    QCOMPARE(target->presses, 2);
-}
-
-void tst_DeclarativeWindow::observersSeeTouchEvents()
-{
-    DeclarativeWindow *window = showWindow();
-    QVERIFY(window);
-    RecordingObserver observer;
-    window->registerObserver(&observer);
-    QTouchDevice *device = QTest::createTouchDevice();
-
-    QTest::touchEvent(m_window.data(), device).press(0, QPoint(40, 40));
-    QTest::touchEvent(m_window.data(), device).move(0, QPoint(40, 90));
-    QTest::touchEvent(m_window.data(), device).release(0, QPoint(40, 90));
-    QCOMPARE(observer.count(QEvent::TouchBegin), 1);
-    QCOMPARE(observer.count(QEvent::TouchUpdate), 1);
-    QCOMPARE(observer.count(QEvent::TouchEnd), 1);
-    window->unregisterObserver(&observer);
-}
-
-void tst_DeclarativeWindow::observersSeeGrabLoss()
-{
-    DeclarativeWindow *window = showWindow();
-    QVERIFY(window);
-    auto target = new PressTarget(window);
-    target->setSize(window->size());
-    auto thief = new QQuickItem(window);
-    RecordingObserver observer;
-    window->registerObserver(&observer);
-
-    QTest::mousePress(m_window.data(), Qt::LeftButton, {}, QPoint(50, 50));
-    QCOMPARE(m_window->mouseGrabberItem(), target);
-    thief->grabMouse();
-    QCOMPARE(observer.count(QEvent::UngrabMouse), 1);
-    QTest::mouseRelease(m_window.data(), Qt::LeftButton, {}, QPoint(50, 50));
-    window->unregisterObserver(&observer);
-}
-
-void tst_DeclarativeWindow::leavingTheWindowWarnsOnlyForATree()
-{
-    DeclarativeWindow *window = showWindow();
-    QVERIFY(window);
-    QQuickItem holder(m_window->contentItem());
-    window->setParentItem(&holder);
-    QTest::ignoreMessage(QtWarningMsg, "DeclarativeWindow::Item does not belong to a window");
-    holder.setParentItem(nullptr);
-    QVERIFY(!window->window());
-
-    // Torn down or detached on purpose: no parent, nothing to say.
-    window->setParentItem(m_window->contentItem());
-    static int warnings;
-    warnings = 0;
-    QtMessageHandler previous = qInstallMessageHandler([](QtMsgType type, const QMessageLogContext &, const QString &) {
-        if (type == QtWarningMsg)
-            ++warnings;
-    });
-    window->setParentItem(nullptr);
-    delete window;
-    qInstallMessageHandler(previous);
-    QCOMPARE(warnings, 0);
-}
-
-void tst_DeclarativeWindow::offWaylandOnlyTheColour()
-{
-    WindowPropertyPublisher::setSinkForTesting([this](QWindow *, const QString &name, const QVariant &value) {
-        m_published.append({ name, value });
-    });
-    DeclarativeWindow *window = showWindow();
-    QVERIFY(window);
-    QCOMPARE(QGuiApplication::platformName(), QStringLiteral("xcb"));
-    window->setPublishCategory(true);
-    window->setBackgroundVisible(false);
-    window->setBackgroundRect(QRectF(0, 0, 10, 10));
-    auto cover = new QWindow;
-    window->_setCover(cover);
-    delete cover;
-    QVERIFY(m_published.isEmpty());
-
-    // The colour is the window's own, not a compositor property: it applies everywhere,
-    // also when declared before the item has a window.
-    window->setParentItem(nullptr);
-    window->setBackgroundColor(QColor(Qt::darkCyan));
-    window->setParentItem(m_window->contentItem());
-    QCOMPARE(m_window->color(), QColor(Qt::darkCyan));
-    QCOMPARE(window->backgroundColor(), QColor(Qt::darkCyan));
-}
-
-void tst_DeclarativeWindow::nothingWithoutANativeHandle()
-{
-    WindowPropertyPublisher::setSinkForTesting([this](QWindow *, const QString &name, const QVariant &value) {
-        m_published.append({ name, value });
-    }, QStringLiteral("wayland"));
-    QQuickWindow hidden;
-    DeclarativeWindow unshown(hidden.contentItem());
-    unshown.setPublishCategory(true);
-    unshown.setBackgroundRect(QRectF(0, 10, 100, 50));
-    QVERIFY(m_published.isEmpty());
-}
-
-void tst_DeclarativeWindow::coverAttachAndDestroy()
-{
-    WindowPropertyPublisher::setSinkForTesting([this](QWindow *, const QString &name, const QVariant &value) {
-        m_published.append({ name, value });
-    }, QStringLiteral("wayland"));
-    DeclarativeWindow *window = showWindow();
-    QVERIFY(window);
-    QSignalSpy switcher(window, &DeclarativeWindow::switcherWindowChanged);
-    auto cover = new QQuickWindow;
-
-    m_published.clear();
-    window->_setCover(cover);
-    QCOMPARE(m_published.first().name, QStringLiteral("QUORVANE_RETAIN_COVER"));
-    QCOMPARE(m_published.first().value, QVariant(true));
-    QCOMPARE(m_published.at(3).name, QStringLiteral("QUORVANE_COVER_WINDOW"));
-    QCOMPARE(m_published.at(3).value.toULongLong(), qulonglong(cover->winId()));
-    // The home screen is told there is a cover with the same publication.
-    QCOMPARE(m_published.at(4).name, QStringLiteral("QUORVANE_HAVE_COVER"));
-    QCOMPARE(m_published.at(4).value, QVariant(true));
-    QCOMPARE(switcher.count(), 1);
-    QCOMPARE(switcher.last().first().value<QQuickWindow *>(), cover);
-
-    // The application is in the foreground: its cover is not on show until it leaves.
-    QVERIFY(!window->coverVisible());
-    m_window->hide();
-    QVERIFY(window->coverVisible());
-    window->setCoverIsPrimaryWindow(true);
-    m_window->show();
-    QVERIFY(window->coverVisible());
-
-    m_published.clear();
-    delete cover;
-    QVERIFY(!window->coverWindow());
-    QCOMPARE(m_published.first().name, QStringLiteral("QUORVANE_RETAIN_COVER"));
-    QCOMPARE(m_published.first().value, QVariant(false));
-    QCOMPARE(m_published.at(4).value, QVariant(false));
-    QVERIFY(!window->haveCoverHint());
-    QVERIFY(!window->coverVisible());
-    QCOMPARE(switcher.count(), 2);
-}
-
-void tst_DeclarativeWindow::queuedDeletionWaitsForAFrame()
-{
-    DeclarativeWindow *window = showWindow();
-    QVERIFY(window);
-    auto item = new QQuickItem(window);
-    QPointer<QQuickItem> guard(item);
-    item->setParentItem(nullptr);
-    window->queueDeletion(item);
-    QVERIFY(guard);
-    QTRY_VERIFY(guard.isNull());
-
-    // Outside a window there is no frame to wait for.
-    DeclarativeWindow loose;
-    auto object = new QObject;
-    QPointer<QObject> looseGuard(object);
-    loose.queueDeletion(object);
-    QTRY_VERIFY(looseGuard.isNull());
 }
 
 QTEST_MAIN(tst_DeclarativeWindow)
