@@ -16,6 +16,7 @@ demo: build
 check: check-deps build
 	scripts/run-tests $(BUILD)
 	scripts/check-package build-package
+	scripts/check-clean-system build-package
 
 check-deps: deps
 	scripts/check-deps
