@@ -56,6 +56,7 @@ models module left out of the runtime package@debian/control@/^[[:space:]]+qml-m
 test module left out of install-deps@scripts/install-deps@s/(^|[[:space:]])qml-module-qttest([[:space:]]|$)/\1\2/@tests/tst_list.qml:1: import QtTest 1.2 comes from qml-module-qttest, which scripts/install-deps does not install
 benchmark peer left out of --bench@scripts/install-deps@s/(^|[[:space:]])qml-module-org-kde-kirigami2([[:space:]"]|$)/\1\2/@benchmarks/main.cpp:1: import org.kde.kirigami 2.10 comes from qml-module-org-kde-kirigami2, which scripts/install-deps --bench does not install
 program left out of install-deps@scripts/install-deps@s/(^|[[:space:]])xvfb([[:space:]]|$)/\1\2/@scripts/run: xvfb-run comes from xvfb, which scripts/install-deps does not install
+package build tool left out of install-deps@scripts/install-deps@s/(^|[[:space:]])build-essential([[:space:]]|$)/\1\2/@debian/control: the package build needs build-essential, which scripts/install-deps does not install
 uninstalled peer named by Debian's rule@benchmarks/main.cpp@s/as Kirigami/as Kirigami\\nimport QtQuick.Particles 2.0/@benchmarks/main.cpp:1: import QtQuick.Particles 2.0 comes from qml-module-qtquick-particles2, which scripts/install-deps --bench does not install
 module no package has@tests/tst_list.qml@s/^import QtTest 1.2$/import Unheard.Of 1.0/@tests/tst_list.qml:1: import Unheard.Of 1.0: no such module
 ROWS
