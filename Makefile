@@ -5,15 +5,21 @@ SANITIZE_BUILD ?= build-sanitize
 FUZZ_SECONDS ?= 20
 JOBS ?= $(shell nproc)
 
-.PHONY: demo check check-sanitized deb deps build
+.PHONY: demo check check-deps check-sanitized deb deps build
 
 demo: build
 	scripts/run-demo $(BUILD)
 
-# Every test, then the packages: built, installed, and used by the application template.
-check: build
+# Every package declared first (a missing one is named before the build trips over it),
+# then every test, then the packages: built, installed and used by the application
+# template here, and installed alone into an empty Debian system.
+check: check-deps build
 	scripts/run-tests $(BUILD)
 	scripts/check-package build-package
+	scripts/check-clean-system build-package
+
+check-deps: deps
+	scripts/check-deps
 
 # Every test again under AddressSanitizer and UndefinedBehaviorSanitizer, then each fuzz
 # target for FUZZ_SECONDS; built with clang so that the fuzz targets use libFuzzer.

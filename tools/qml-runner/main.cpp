@@ -1,8 +1,13 @@
-// Runs one QML file as an application would: pelkan-qml-runner FILE [name=value ...],
-// with the modules of the build tree it was built in.
+// Runs one QML file as an application would: pelkan-qml-runner FILE [name=value ...], with
+// the modules of the build tree it was built in when it runs from there, the installed
+// ones otherwise.
 // Each name=value sets a property of the root object before it completes ("true" and
-// "false" are booleans, whole numbers are integers, anything else is text).
+// "false" are booleans, whole numbers are integers, anything else is text) and keeps it
+// there: deviceOrientation=2 turns the device for as long as the runner runs.
 
+#include "propertypin.h"
+
+#include <QDir>
 #include <QGuiApplication>
 #include <QQmlApplicationEngine>
 #include <QQuickWindow>
@@ -37,10 +42,18 @@ int main(int argc, char *argv[])
     }
 
     QQmlApplicationEngine engine;
-    engine.addImportPath(QStringLiteral(PELKAN_QML_DIR));
+    if (QDir(QCoreApplication::applicationDirPath()) == QDir(QStringLiteral(PELKAN_BUILD_BIN_DIR)))
+        engine.addImportPath(QStringLiteral(PELKAN_QML_DIR));
     engine.setInitialProperties(properties);
     engine.load(QUrl::fromLocalFile(arguments.at(1)));
     if (engine.rootObjects().isEmpty())
         return 1;
+    for (QObject *root : engine.rootObjects()) {
+        for (auto it = properties.cbegin(); it != properties.cend(); ++it) {
+            const int index = root->metaObject()->indexOfProperty(it.key().toUtf8().constData());
+            if (index >= 0)
+                new PropertyPin(root, root->metaObject()->property(index), it.value());
+        }
+    }
     return app.exec();
 }
