@@ -54,7 +54,8 @@ Private.ButtonBase {
     }
     QtObject {
         id: remorse
-        readonly property int row: item.DelegateModel.itemsIndex
+        // -1 for a row outside a view
+        readonly property int row: item.DelegateModel.itemsIndex !== undefined ? item.DelegateModel.itemsIndex : -1
         // The countdown shown; the view's cache deletes it when it ends.
         property QtObject countdown: null
         property Item overlay: null

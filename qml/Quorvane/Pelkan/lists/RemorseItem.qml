@@ -31,6 +31,13 @@ Private.ButtonBase {
 
     QtObject {
         id: internal
+        // The catalogue's sentence; without a catalogue (a build tree) its id, as it is.
+        function sentence(what, seconds) {
+            var words = what.length ? qsTrId("quorvanepelkan-la-remorse_action") : qsTrId("quorvanepelkan-la-remorse")
+            if (words.indexOf("%1") < 0)
+                return words
+            return what.length ? words.arg(what).arg(seconds) : words.arg(seconds)
+        }
         property int secondsLeft: 0
         function refresh() {
             secondsLeft = remorse.countdown ? Math.ceil(remorse.countdown.remaining() / 1000) : 0
@@ -68,8 +75,7 @@ Private.ButtonBase {
         }
         horizontalAlignment: Text.AlignLeft
         elide: Text.ElideRight
-        text: remorse.text.length ? qsTrId("quorvanepelkan-la-remorse_action").arg(remorse.text).arg(remorse.secondsLeft)
-                                  : qsTrId("quorvanepelkan-la-remorse").arg(remorse.secondsLeft)
+        text: internal.sentence(remorse.text, remorse.secondsLeft)
         color: Theme.primaryColor
         font.pixelSize: Theme.fontSizeSmall
     }

@@ -51,6 +51,13 @@ Private.ButtonBase {
 
     QtObject {
         id: internal
+        // The catalogue's sentence; without a catalogue (a build tree) its id, as it is.
+        function sentence(what, seconds) {
+            var words = what.length ? qsTrId("quorvanepelkan-la-remorse_action") : qsTrId("quorvanepelkan-la-remorse")
+            if (words.indexOf("%1") < 0)
+                return words
+            return what.length ? words.arg(what).arg(seconds) : words.arg(seconds)
+        }
 
         property var action: null
         property double deadline: 0
@@ -121,8 +128,7 @@ Private.ButtonBase {
             verticalCenter: popup.verticalCenter
         }
         elide: Text.ElideRight
-        text: popup.text.length ? qsTrId("quorvanepelkan-la-remorse_action").arg(popup.text).arg(popup.secondsLeft)
-                                : qsTrId("quorvanepelkan-la-remorse").arg(popup.secondsLeft)
+        text: internal.sentence(popup.text, popup.secondsLeft)
         color: Theme.primaryColor
         font.pixelSize: Theme.fontSizeSmall
     }
