@@ -3,6 +3,7 @@
 // property only menus have) and the flickable above that. Prints medians and the ratio
 // (below 1: Util is cheaper).
 
+#include "../common/summary.h"
 #include "../common/median.h"
 
 #include <QElapsedTimer>
@@ -64,5 +65,7 @@ int main(int argc, char *argv[])
     QTextStream(stdout) << QStringLiteral("2000 entries finding their menu and flickable (median of 15): "
                                           "script %1 ms, Util %2 ms, %3x\n")
                                .arg(median(a), 0, 'f', 2).arg(median(b), 0, 'f', 2).arg(median(b) / median(a), 0, 'f', 2);
+    Summary::row(QStringLiteral("ancestor lookups, Util vs the same walk in script"), Summary::ms(median(b)),
+                 Summary::ms(median(a)), median(b) / median(a), Summary::AtMost, 0.5);
     return 0;
 }
