@@ -25,6 +25,7 @@ private Q_SLOTS:
     void touchFeedback();
     void formattedTimeFollows_data();
     void formattedTimeFollows();
+    void ancestorLookups();
 
 private:
     QObject *create(const QByteArray &body);
@@ -171,5 +172,29 @@ void tst_PlatformServices::formattedTimeFollows()
     tzset();
 }
 
+// Util's lookups walk up from the item's parent; anything but an item finds nothing. The
+// calls run in order on the same types, so answers kept per type and name must not leak.
+void tst_PlatformServices::ancestorLookups()
+{
+    QScopedPointer<QObject> object(create("Flickable { objectName: 'flickable'\n"
+                                          "  function name(found) { return found ? found.objectName : '-' }\n"
+                                          "  property var results: [\n"
+                                          "    name(Private.Util.findAncestor(leaf, 'marker')), name(Private.Util.findAncestor(holder, 'marker')),\n"
+                                          "    name(Private.Util.findAncestor(leaf, 'status')), name(Private.Util.findAncestor(leaf, 'nowhere')),\n"
+                                          "    name(Private.Util.findFlickable(leaf)), name(Private.Util.findPage(leaf)),\n"
+                                          "    name(Private.Util.findPage(page)), name(Private.Util.findAncestor(null, 'marker')),\n"
+                                          "    name(Private.Util.findFlickable(plain)) ]\n"
+                                          "  property QtObject plain: QtObject {}\n"
+                                          "  Item { id: outer; objectName: 'outer'; property bool marker\n"
+                                          "    Item { id: page; objectName: 'page'; property Item pageStack; property int status\n"
+                                          "                     property int allowedOrientations\n"
+                                          "      Item { id: holder; objectName: 'holder'; property bool marker\n"
+                                          "        Item { id: leaf } } } } }"));
+    QVERIFY(object);
+    QCOMPARE(object->property("results").toStringList(),
+             QStringList({ "holder", "outer", "page", "-", "flickable", "page", "-", "-", "-" }));
+}
+
 QTEST_MAIN(tst_PlatformServices)
 #include "tst_platformservices.moc"
+
