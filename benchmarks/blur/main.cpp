@@ -12,6 +12,7 @@
 #include <QRegularExpression>
 #include <QTextStream>
 
+#include "../common/summary.h"
 #include "../common/frametiming.h"
 
 #include <algorithm>
@@ -99,5 +100,9 @@ int main(int argc, char *argv[])
                                           "  ratios: against GaussianBlur %4x, against FastBlur %5x\n")
                                    .arg(median(ours), 0, 'f', 2).arg(median(gaussian), 0, 'f', 2).arg(median(fast), 0, 'f', 2)
                                    .arg(median(ours) / median(gaussian), 0, 'f', 2).arg(median(ours) / median(fast), 0, 'f', 2);
+    Summary::row(QStringLiteral("full-window live blur vs GaussianBlur"), Summary::ms(median(ours)),
+                 Summary::ms(median(gaussian)), median(ours) / median(gaussian));
+    Summary::row(QStringLiteral("full-window live blur vs FastBlur"), Summary::ms(median(ours)),
+                 Summary::ms(median(fast)), median(ours) / median(fast));
     return 0;
 }

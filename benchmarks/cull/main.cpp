@@ -3,6 +3,7 @@
 // alone, and scrolling while the page fades (as during a page transition, when every
 // row's vertices change with the opacity). Prints both and the ratios.
 
+#include "../common/summary.h"
 #include "../common/documentview.h"
 #include "../common/framework.h"
 
@@ -73,6 +74,8 @@ void report(QTextStream &out, const char *what, bool fade)
     out << QStringLiteral("  %1: with VisibilityCull %2 ms (%3 rows drawn), without %4 ms (1000 rows): %5x faster, %6x fewer rows\n")
                .arg(QLatin1String(what)).arg(with[1], 0, 'f', 2).arg(drawnWith).arg(without[1], 0, 'f', 2)
                .arg(without[1] / with[1], 0, 'f', 2).arg(1000.0 / qMax(1, drawnWith), 0, 'f', 1);
+    Summary::row(QStringLiteral("1000-row column, %1, VisibilityCull vs none").arg(QLatin1String(what)),
+                 Summary::ms(with[1]), Summary::ms(without[1]), with[1] / without[1]);
 }
 
 } // namespace

@@ -4,6 +4,8 @@
 
 #include "text/declarativeformatter.h"
 
+#include "../common/summary.h"
+
 #include <KFormat>
 
 #include <QCoreApplication>
@@ -64,6 +66,8 @@ void report(QTextStream &out, const char *name, double ours, double theirs)
                .arg(ours, 10, 'f', 0)
                .arg(theirs, 10, 'f', 0)
                .arg(ours / theirs, 0, 'f', 2);
+    Summary::row(QStringLiteral("formatter calls per second, %1, vs KFormat").arg(QLatin1String(name)),
+                 Summary::count(ours, "/s"), Summary::count(theirs, "/s"), ours / theirs, Summary::AtLeast, 1.0);
 }
 
 } // namespace

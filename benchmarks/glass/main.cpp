@@ -6,6 +6,7 @@
 //   three that each capture and blur the scene behind them that way.
 // Prints medians and the ratios.
 
+#include "../common/summary.h"
 #include "../common/documentview.h"
 #include "../common/framework.h"
 #include "../common/median.h"
@@ -78,6 +79,8 @@ void compare(const QList<QRect> &panels, const QString &what, const QString &pee
     QTextStream(stdout) << QStringLiteral("%1, work per frame (median of 5): ours %2 ms, %3 %4 ms, %5x\n")
                                .arg(what).arg(median(ours), 0, 'f', 2).arg(peer).arg(median(theirs), 0, 'f', 2)
                                .arg(median(ours) / median(theirs), 0, 'f', 2);
+    Summary::row(what + QStringLiteral(" vs ") + peer, Summary::ms(median(ours)), Summary::ms(median(theirs)),
+                 median(ours) / median(theirs));
 }
 
 } // namespace

@@ -24,6 +24,7 @@
 #include <QTextStream>
 #include <QTimer>
 
+#include "../common/summary.h"
 #include "../common/frametiming.h"
 
 #include <algorithm>
@@ -133,6 +134,10 @@ int main(int argc, char *argv[])
                           "  theme provider, tinted and bordered %1\n  plain provider, untinted %2\n  ratio %3x\n")
                    .arg(median(ours), 0, 'f', 0).arg(median(qts), 0, 'f', 0).arg(median(ours) / median(qts), 0, 'f', 2);
 
+    Summary::row(QStringLiteral("theme icons decoded, tinted+bordered vs plain provider untinted"),
+                 Summary::count(median(ours), "/s"), Summary::count(median(qts), "/s"), median(ours) / median(qts),
+                 Summary::AtLeast, 1.0);
+
     // 2. Drawing, each page in a process of its own with the renderer's batch report.
     auto page = [&](const QString &kind, double *frameMs, int *batches) {
         QProcess child;
@@ -161,5 +166,7 @@ int main(int argc, char *argv[])
                           "  ratios: batches %5x, frame time %6x\n")
                    .arg(themeBatches).arg(themeMs, 0, 'f', 2).arg(overlayBatches).arg(overlayMs, 0, 'f', 2)
                    .arg(double(themeBatches) / qMax(1, overlayBatches), 0, 'f', 3).arg(themeMs / overlayMs, 0, 'f', 2);
+    Summary::row(QStringLiteral("page of 200 tinted icons, frame time vs Image+ColorOverlay"), Summary::ms(themeMs),
+                 Summary::ms(overlayMs), themeMs / overlayMs);
     return 0;
 }

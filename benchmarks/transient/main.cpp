@@ -5,6 +5,8 @@
 
 #include "rendering/providers/transientimageprovider.h"
 
+#include "../common/summary.h"
+
 #include <QDir>
 #include <QFile>
 #include <QGuiApplication>
@@ -109,5 +111,9 @@ int main(int argc, char *argv[])
                                    .arg(provider - providerTransient, 0, 'f', 0).arg(plain, 0, 'f', 0)
                                    .arg(plainTransient, 0, 'f', 0).arg(provider / plain, 0, 'f', 2)
                                    .arg(providerTransient / plainTransient, 0, 'f', 2);
+    Summary::row(QStringLiteral("8 large photos, transientimage provider vs file Image"), Summary::mb(provider),
+                 Summary::mb(plain), provider / plain);
+    Summary::row(QStringLiteral("8 large photos, the same with QSG_TRANSIENT_IMAGES"), Summary::mb(providerTransient),
+                 Summary::mb(plainTransient), providerTransient / plainTransient);
     return 0;
 }

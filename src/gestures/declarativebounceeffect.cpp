@@ -6,6 +6,7 @@
 #include <QQuickItem>
 #include <QQuickWindow>
 #include <QStyleHints>
+#include <private/qquickflickable_p.h>
 
 #include <cmath>
 
@@ -61,6 +62,7 @@ void DeclarativeBounceEffect::setFlickable(QQuickItem *flickable)
     if (m_flickable)
         disconnect(m_flickable, nullptr, this, nullptr);
     m_flickable = flickable;
+    m_view = qobject_cast<QQuickFlickable *>(flickable);
     if (flickable) {
         connect(flickable, &QQuickItem::visibleChanged, this, &DeclarativeBounceEffect::activeFlickableChanged);
         connect(flickable, &QQuickItem::enabledChanged, this, &DeclarativeBounceEffect::activeFlickableChanged);
@@ -79,7 +81,8 @@ void DeclarativeBounceEffect::activeFlickableChanged()
 {
     if (!m_flickable)
         return;
-    const bool usable = m_flickable->isVisible() && m_flickable->isEnabled() && readBool(m_flickable, "interactive");
+    const bool usable = m_flickable->isVisible() && m_flickable->isEnabled()
+            && (m_view ? m_view->isInteractive() : readBool(m_flickable, "interactive"));
     if (usable == m_attached)
         return;
     if (!usable) {
@@ -94,19 +97,34 @@ void DeclarativeBounceEffect::activeFlickableChanged()
     }
 }
 
-int DeclarativeBounceEffect::directions() const
+DeclarativeBounceEffect::Geometry DeclarativeBounceEffect::geometry() const
 {
+    Geometry g;
     if (!m_flickable)
-        return 0;
-    const int flickDirection = PropertyCache::read(m_flickable, "flickableDirection").toInt();
-    const qreal contentWidth = readReal(m_flickable, "contentWidth");
-    const qreal contentHeight = readReal(m_flickable, "contentHeight");
-    int result = 0;
-    if ((flickDirection & Horizontal) || (contentWidth > 0 && contentWidth != m_flickable->width()))
-        result |= Horizontal;
-    if ((flickDirection & Vertical) || (contentHeight > 0 && contentHeight != m_flickable->height()))
-        result |= Vertical;
-    return result;
+        return g;
+    int flickDirection;
+    if (m_view) { // every mouse move of the window comes here: no lookups by name
+        flickDirection = m_view->flickableDirection();
+        g.contentWidth = m_view->contentWidth();
+        g.contentHeight = m_view->contentHeight();
+        g.atXBeginning = m_view->isAtXBeginning();
+        g.atXEnd = m_view->isAtXEnd();
+        g.atYBeginning = m_view->isAtYBeginning();
+        g.atYEnd = m_view->isAtYEnd();
+    } else {
+        flickDirection = PropertyCache::read(m_flickable, "flickableDirection").toInt();
+        g.contentWidth = readReal(m_flickable, "contentWidth");
+        g.contentHeight = readReal(m_flickable, "contentHeight");
+        g.atXBeginning = readBool(m_flickable, "atXBeginning");
+        g.atXEnd = readBool(m_flickable, "atXEnd");
+        g.atYBeginning = readBool(m_flickable, "atYBeginning");
+        g.atYEnd = readBool(m_flickable, "atYEnd");
+    }
+    if ((flickDirection & Horizontal) || (g.contentWidth > 0 && g.contentWidth != m_flickable->width()))
+        g.directions |= Horizontal;
+    if ((flickDirection & Vertical) || (g.contentHeight > 0 && g.contentHeight != m_flickable->height()))
+        g.directions |= Vertical;
+    return g;
 }
 
 void DeclarativeBounceEffect::deactivate()
@@ -125,13 +143,13 @@ void DeclarativeBounceEffect::windowEvent(QEvent *event)
     if (!m_flickable || !m_flickable->window())
         return;
 
-    const int dirs = directions();
+    const Geometry g = geometry();
     bool atEdge = false;
-    if (dirs & Vertical)
-        atEdge = readBool(m_flickable, "atYBeginning") || readBool(m_flickable, "atYEnd");
-    if (!atEdge && (dirs & Horizontal))
-        atEdge = readBool(m_flickable, "atXBeginning") || readBool(m_flickable, "atXEnd");
-    if (!dirs || !atEdge) {
+    if (g.directions & Vertical)
+        atEdge = g.atYBeginning || g.atYEnd;
+    if (!atEdge && (g.directions & Horizontal))
+        atEdge = g.atXBeginning || g.atXEnd;
+    if (!g.directions || !atEdge) {
         if (m_active)
             deactivate();
         return;
@@ -154,7 +172,7 @@ void DeclarativeBounceEffect::windowEvent(QEvent *event)
     case QEvent::MouseMove: {
         // The anchor stays in window coordinates while moves are in the flickable's.
         const QPointF position = rounded(static_cast<QMouseEvent *>(event)->windowPos());
-        handleMove(m_flickable->mapFromItem(window->contentItem(), position));
+        move(m_flickable->mapFromItem(window->contentItem(), position), g);
         break;
     }
     case QEvent::UngrabMouse:
@@ -189,33 +207,38 @@ void DeclarativeBounceEffect::handlePress(QPointF pos)
 
 void DeclarativeBounceEffect::handleMove(QPointF pos)
 {
+    move(pos, geometry());
+}
+
+void DeclarativeBounceEffect::move(QPointF pos, const Geometry &flickable)
+{
     if (!m_flickable || !m_attached)
         return;
     const int t = QGuiApplication::styleHints()->startDragDistance();
-    const int dirs = directions();
+    const int dirs = flickable.directions;
     qreal d = 0;
     QPointF anchor = pos;
 
     if (dirs & Vertical) {
         const qreal dy = pos.y() - m_anchor.y();
-        const bool overflows = readReal(m_flickable, "contentHeight") > m_flickable->height();
+        const bool overflows = flickable.contentHeight > m_flickable->height();
         bool qualified = false;
-        if (readBool(m_flickable, "atYBeginning"))
+        if (flickable.atYBeginning)
             qualified = dy > 0 && (overflows || readObject(m_flickable, "pullDownMenu"));
         if (qualified) {
             d = dy;
             anchor.setY(pos.y() + qMax<qreal>(0, dy - t));
-        } else if (readBool(m_flickable, "atYEnd") && dy < 0 && (overflows || readObject(m_flickable, "pushUpMenu"))) {
+        } else if (flickable.atYEnd && dy < 0 && (overflows || readObject(m_flickable, "pushUpMenu"))) {
             d = -dy;
             anchor.setY(pos.y() - qMax<qreal>(0, -dy - t));
         }
     }
-    if ((dirs & Horizontal) && readReal(m_flickable, "contentWidth") > m_flickable->width()) {
+    if ((dirs & Horizontal) && flickable.contentWidth > m_flickable->width()) {
         const qreal dx = pos.x() - m_anchor.x();
-        if (readBool(m_flickable, "atXBeginning") && dx > d) {
+        if (flickable.atXBeginning && dx > d) {
             d = dx;
             anchor.setX(pos.x() + qMax<qreal>(0, dx - t));
-        } else if (readBool(m_flickable, "atXEnd") && dx < -d) {
+        } else if (flickable.atXEnd && dx < -d) {
             d = -dx;
             anchor.setX(pos.x() - qMax<qreal>(0, -dx - t));
         }

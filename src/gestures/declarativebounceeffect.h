@@ -8,6 +8,7 @@
 #include <QQmlListProperty>
 
 class DeclarativeWindow;
+class QQuickFlickable;
 class QQuickItem;
 
 // Measures how far the user keeps dragging past the edge of a flickable, so that the QML
@@ -51,11 +52,20 @@ private Q_SLOTS:
 
 private:
     enum Direction { Horizontal = 1, Vertical = 2 };
-    int directions() const;
+    // What one event needs of the flickable, read once per event: directly from a Qt
+    // Quick Flickable, by property name from anything else.
+    struct Geometry {
+        int directions = 0;
+        bool atXBeginning = false, atXEnd = false, atYBeginning = false, atYEnd = false;
+        qreal contentWidth = 0, contentHeight = 0;
+    };
+    Geometry geometry() const;
+    void move(QPointF pos, const Geometry &flickable);
     void deactivate();
     void detach();
 
     QPointer<QQuickItem> m_flickable;
+    QQuickFlickable *m_view = nullptr; // m_flickable as a Flickable, when it is one
     QPointer<DeclarativeWindow> m_window;
     QPointF m_pressPosition;
     QPointF m_anchor;

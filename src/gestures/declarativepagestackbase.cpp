@@ -148,6 +148,10 @@ bool DeclarativePageStackBase::handleMouse(QMouseEvent *event)
         return false;
     if (event->type() != QEvent::MouseButtonPress && event->type() != QEvent::MouseMove)
         return false;
+    // Most moves reach the stack while no gesture is tracked (another item took the touch,
+    // or navigation is off): they change nothing, so the position is not worked out.
+    if (event->type() == QEvent::MouseMove && !m_pressed && !m_noGrabbing)
+        return m_mouseGrabbed;
 
     const QPointF inParent = parentItem()->mapFromScene(event->windowPos())
             + QPointF(m_currentContainer->x(), m_currentContainer->y());

@@ -17,10 +17,13 @@ class DeclarativeUtil : public QObject
 public:
     explicit DeclarativeUtil(QObject *parent = nullptr);
 
-    Q_INVOKABLE QQuickItem *findFlickable(QQuickItem *item) const;
-    Q_INVOKABLE QQuickItem *findPage(QQuickItem *item) const;
+    // The lookups take and return QObject: the engine hands such arguments and results over
+    // as they are, while any other pointer type goes through a QVariant conversion on each
+    // call, which costs several times the walk itself. Anything but an item finds nothing.
+    Q_INVOKABLE QObject *findFlickable(QObject *item) const;
+    Q_INVOKABLE QObject *findPage(QObject *item) const;
     // The nearest ancestor (not item itself) that has property; null when none.
-    Q_INVOKABLE QQuickItem *findAncestor(QQuickItem *item, const QString &property) const;
+    Q_INVOKABLE QObject *findAncestor(QObject *item, const QString &property) const;
     Q_INVOKABLE QRectF mapRect(QQuickItem *from, QQuickItem *to, const QRectF &rect) const;
     // Visible, not fully transparent along its ancestors, and at least partly inside its window.
     Q_INVOKABLE bool isVisibleInWindow(QQuickItem *item) const;

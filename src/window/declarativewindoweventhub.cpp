@@ -4,6 +4,7 @@
 #include <QMouseEvent>
 #include <QQuickWindow>
 #include <QTouchEvent>
+#include <QVarLengthArray>
 
 // The event hub: every pointer event of the window, handed to registered observers, with
 // mouse events made from touch for observers written for the mouse.
@@ -55,8 +56,12 @@ bool DeclarativeWindow::childMouseEventFilter(QQuickItem *item, QEvent *event)
 void DeclarativeWindow::dispatch(QEvent *event)
 {
     const bool accepted = event->isAccepted();
-    const QList<WindowEventObserver *> observers = m_observers.values();
-    for (WindowEventObserver *observer : observers) {
+    // A copy, since an observer may register or unregister others; on the stack, since
+    // this runs for every pointer event of the window.
+    QVarLengthArray<WindowEventObserver *, 8> observers;
+    for (WindowEventObserver *observer : qAsConst(m_observers))
+        observers.append(observer);
+    for (WindowEventObserver *observer : qAsConst(observers)) {
         // An earlier observer may have unregistered this one.
         if (!m_observers.contains(observer))
             continue;

@@ -69,6 +69,10 @@ void tst_DeclarativeImageProvider::initTestCase()
     writeIcon(QStringLiteral("icon-square"), QSize(32, 32), false);
     writeIcon(QStringLiteral("icon-themed"), QSize(32, 32), true);
     writeIcon(QStringLiteral("icon-large"), QSize(600, 40), false);
+    // Named as a PNG, but JPEG data: read all the same.
+    QImage photo(32, 32, QImage::Format_RGB32);
+    photo.fill(Qt::gray);
+    QVERIFY(photo.save(m_theme.filePath(QStringLiteral("icons/icon-misnamed.png")), "JPEG"));
     QFile corrupt(m_theme.filePath(QStringLiteral("icons/icon-corrupt.png")));
     QVERIFY(corrupt.open(QIODevice::WriteOnly));
     corrupt.write("\x89PNG\r\n\x1a\n not really");
@@ -96,6 +100,7 @@ void tst_DeclarativeImageProvider::requestTexture_data()
     QTest::newRow("unparsable colour") << "icon-themed?notacolour" << QSize() << QSize(34, 34);
     QTest::newRow("scaled") << "icon-square" << QSize(16, 16) << QSize(18, 18);
     QTest::newRow("large") << "icon-large" << QSize() << QSize(602, 42);
+    QTest::newRow("data not as named") << "icon-misnamed?#00ff00" << QSize() << QSize(34, 34);
     QTest::newRow("unknown name") << "icon-missing" << QSize() << QSize();
     QTest::newRow("path escape") << "../icons/icon-square" << QSize() << QSize();
 }

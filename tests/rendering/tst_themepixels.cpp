@@ -78,6 +78,17 @@ void tst_ThemePixels::tint()
     for (int y = 0; y < 3; ++y)
         for (int x = 0; x < 3; ++x)
             QCOMPARE(bytesAt(bordered, x, y), expected);
+
+    // The pixel among clear (or black) ones in a line long enough to be tinted four pixels
+    // at a time, with a clear round, a mixed one and a rest.
+    QImage line(9, 1, source.format());
+    line.setColorTable(source.colorTable());
+    line.fill(0);
+    for (int x : { 4, 6, 8 })
+        line.setPixel(x, 0, source.format() == QImage::Format_Indexed8 ? source.pixelIndex(0, 0) : source.pixel(0, 0));
+    const QImage tinted = render(line, tint, false);
+    for (int x = 0; x < 9; ++x)
+        QCOMPARE(bytesAt(tinted, x, 0), x == 4 || x == 6 || x == 8 ? expected : rgba(0, 0, 0, 0));
 }
 
 void tst_ThemePixels::copyWithoutTint()

@@ -151,6 +151,29 @@ private Q_SLOTS:
         tzset();
     }
 
+    // Util's lookups walk up from the item's parent; anything but an item finds nothing. The
+    // calls run in order on the same types, so answers kept per type and name must not leak.
+    void ancestorLookups()
+    {
+        QScopedPointer<QObject> object(create("Flickable { objectName: 'flickable'\n"
+                                              "  function name(found) { return found ? found.objectName : '-' }\n"
+                                              "  property var results: [\n"
+                                              "    name(Private.Util.findAncestor(leaf, 'marker')), name(Private.Util.findAncestor(holder, 'marker')),\n"
+                                              "    name(Private.Util.findAncestor(leaf, 'status')), name(Private.Util.findAncestor(leaf, 'nowhere')),\n"
+                                              "    name(Private.Util.findFlickable(leaf)), name(Private.Util.findPage(leaf)),\n"
+                                              "    name(Private.Util.findPage(page)), name(Private.Util.findAncestor(null, 'marker')),\n"
+                                              "    name(Private.Util.findFlickable(plain)) ]\n"
+                                              "  property QtObject plain: QtObject {}\n"
+                                              "  Item { id: outer; objectName: 'outer'; property bool marker\n"
+                                              "    Item { id: page; objectName: 'page'; property Item pageStack; property int status\n"
+                                              "                     property int allowedOrientations\n"
+                                              "      Item { id: holder; objectName: 'holder'; property bool marker\n"
+                                              "        Item { id: leaf } } } } }"));
+        QVERIFY(object);
+        QCOMPARE(object->property("results").toStringList(),
+                 QStringList({ "holder", "outer", "page", "-", "flickable", "page", "-", "-", "-" }));
+    }
+
     void clipboard()
     {
         QGuiApplication::clipboard()->clear();

@@ -6,11 +6,16 @@ Kirigami.ApplicationWindow {
     width: 540
     height: 960
     visible: true
-    pageStack.initialPage: Kirigami.ScrollablePage {
-        title: "Hello"
-        ListView {
-            model: 50
-            delegate: Kirigami.BasicListItem { label: "Row " + index }
+    pageStack.initialPage: page
+    Component {
+        id: page
+        Kirigami.ScrollablePage {
+            title: "Hello"
+            ListView {
+                objectName: "rows"
+                model: 50
+                delegate: Kirigami.BasicListItem { label: "Row " + index }
+            }
         }
     }
 }
