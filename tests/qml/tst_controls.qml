@@ -14,9 +14,7 @@ Item {
 
     ButtonLayout {
         id: buttons
-        width: 400
-        columnSpacing: 10
-        rowSpacing: 5
+        width: 400; columnSpacing: 10; rowSpacing: 5
         Item { id: b0; implicitWidth: 100; implicitHeight: 30 }
         Item { id: b1; implicitWidth: 120; implicitHeight: 30 }
         Item { id: b2; implicitWidth: 80; implicitHeight: 30 }
@@ -24,10 +22,7 @@ Item {
 
     Page {
         id: page
-        y: 100
-        width: root.width
-        height: 1200
-
+        y: 100; width: root.width; height: 1200
         Column {
             id: controls
             width: root.width
@@ -46,10 +41,7 @@ Item {
 
     Flickable {
         id: flick
-        y: 1400
-        width: root.width
-        height: 300
-        contentHeight: 2000
+        y: 1400; width: root.width; height: 300; contentHeight: 2000
         Slider { id: flickSlider; y: 100; minimumValue: 0; maximumValue: 100; stepSize: 25 }
     }
 
@@ -265,6 +257,7 @@ Item {
             compare(String(control.palette.highlightColor), String(Theme.highlightColor))
         }
 
+        // A tap opens the menu under the row; a tap on its second entry picks it.
         function test_comboBox() {
             var activated = []
             combo.activated.connect(function(i) { activated.push(i) })
@@ -272,7 +265,6 @@ Item {
             mouseClick(combo, combo.width / 2, Theme.itemSizeSmall / 2)
             verify(combo.menuOpen)
             waitForRendering(combo) // the menu's column laid out
-            // Second entry of the menu under the row.
             mouseClick(combo, combo.width / 2, combo.height - (combo.height - Theme.itemSizeSmall) / 2)
             verify(!combo.menuOpen)
             compare(combo.currentIndex, 1)
@@ -301,9 +293,8 @@ Item {
             compare(wheels.length, data.wheels)
             compare(wheels[0].count, data.mode === DateTime.TwelveHours ? 12 : 24)
             var wheel = wheels[data.wheel]
-            // The entry just under the current one, in view.
             wheel.forceLayout()
-            // The wheel turns to the current entry first; a tap while it turns only stops it.
+            // The wheel turns to the current entry first (a tap while it turns only stops it).
             tryCompare(wheel, "contentY", (wheel.currentIndex - 1) * wheel.itemHeight)
             var entry = wheel.itemAtIndex(data.entry)
             mouseClick(entry)
