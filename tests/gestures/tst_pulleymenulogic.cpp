@@ -1,86 +1,76 @@
 #include "gestures/pulleymenulogic.h"
 
+#include <QQmlComponent>
+#include <QQmlEngine>
 #include <QQuickItem>
 #include <QtTest>
 
 #include <cmath>
 
-// The flickable as the logic sees it: properties by name; writes announce a change.
-class FakeFlickable : public QObject
-{
-    Q_OBJECT
-    Q_PROPERTY(qreal contentY MEMBER contentY NOTIFY contentYChanged)
-    Q_PROPERTY(qreal verticalVelocity MEMBER verticalVelocity NOTIFY verticalVelocityChanged)
-    Q_PROPERTY(bool dragging MEMBER dragging NOTIFY draggingChanged)
-    Q_PROPERTY(qreal flickDeceleration MEMBER flickDeceleration)
-    Q_PROPERTY(bool moving MEMBER moving)
-    Q_PROPERTY(bool flickingVertically MEMBER flickingVertically)
-    Q_PROPERTY(qreal contentHeight MEMBER contentHeight)
-    Q_PROPERTY(qreal originY MEMBER originY)
-    Q_PROPERTY(qreal height MEMBER height)
-    Q_PROPERTY(QObject *pullDownMenu MEMBER pullDownMenu)
-    Q_PROPERTY(QObject *pushUpMenu MEMBER pushUpMenu)
-
-public:
-    qreal contentY = 0, verticalVelocity = 0, flickDeceleration = 1500, contentHeight = 2000, originY = 0, height = 800;
-    bool dragging = false, moving = false, flickingVertically = false;
-    QObject *pullDownMenu = nullptr, *pushUpMenu = nullptr;
-
-Q_SIGNALS:
-    void contentYChanged();
-    void verticalVelocityChanged();
-    void draggingChanged();
-    void flickEnded();
-};
-
-// The menu as the logic sees it: an item 200 high (how far it reaches) with the properties
-// the logic reads by name.
-class FakeMenu : public QQuickItem
-{
-    Q_OBJECT
-    Q_PROPERTY(bool active MEMBER active)
-    Q_PROPERTY(qreal _inactivePosition MEMBER inactivePosition)
-    Q_PROPERTY(qreal _snapThreshold MEMBER snapThreshold)
-    Q_PROPERTY(qreal _snapCalculationVelocity MEMBER snapVelocity)
-    Q_PROPERTY(bool _pullDown MEMBER pullDown)
-    Q_PROPERTY(qreal _finalPosition MEMBER finalPosition)
-    Q_PROPERTY(bool _activationInhibited MEMBER activationInhibited)
-    Q_PROPERTY(bool _changingListView MEMBER changingListView)
-    Q_PROPERTY(QObject *_contentColumn MEMBER contentColumn)
-    Q_PROPERTY(qreal _maxDragPosition MEMBER maxDragPosition)
-
-public:
-    FakeMenu() { setHeight(200); }
-    bool active = false, pullDown = true, activationInhibited = false, changingListView = false;
-    qreal inactivePosition = 0, snapThreshold = 100, snapVelocity = 300, finalPosition = -500, maxDragPosition = 1200;
-    QObject *contentColumn = nullptr;
-};
+// The menu (200 high: how far it reaches) and the flickable as the logic sees them:
+// properties by name, with their change signals.
+static const char Fakes[] = R"(
+import QtQuick 2.6
+QtObject {
+    property Item menu: Item {
+        height: 200
+        property bool active
+        property real _inactivePosition
+        property real _snapThreshold: 100
+        property real _snapCalculationVelocity: 300
+        property bool _pullDown: true
+        property real _finalPosition: -500
+        property bool _activationInhibited
+        property bool _changingListView
+        property Item _contentColumn
+        property real _maxDragPosition: 1200
+    }
+    property QtObject flickable: QtObject {
+        property real contentY
+        property real verticalVelocity
+        property bool dragging
+        property real flickDeceleration: 1500
+        property bool moving
+        property bool flickingVertically
+        property real contentHeight: 2000
+        property real originY
+        property real height: 800
+        property Item pullDownMenu
+        property Item pushUpMenu
+        signal flickEnded
+    }
+})";
 
 class tst_PulleyMenuLogic : public QObject
 {
     Q_OBJECT
 
-    FakeMenu *m_menu = nullptr;
-    FakeFlickable *m_flickable = nullptr;
+    QQmlEngine m_engine;
+    QScopedPointer<QObject> m_fakes;
+    QQuickItem *m_menu = nullptr;
+    QObject *m_flickable = nullptr;
     PulleyMenuLogic *m_logic = nullptr;
 
-    void set(const char *name, const QVariant &value) { QVERIFY(m_flickable->setProperty(name, value)); }
+    void set(QObject *object, const char *name, const QVariant &value) { QVERIFY(object->setProperty(name, value)); }
+    void set(const char *name, const QVariant &value) { set(m_flickable, name, value); }
+    bool active() const { return m_menu->property("active").toBool(); }
+    qreal position() const { return m_flickable->property("contentY").toReal(); }
 
 private Q_SLOTS:
     void init()
     {
-        m_menu = new FakeMenu;
-        m_flickable = new FakeFlickable;
+        QQmlComponent component(&m_engine);
+        component.setData(Fakes, QUrl());
+        m_fakes.reset(component.create());
+        QVERIFY2(m_fakes, qPrintable(component.errorString()));
+        m_menu = m_fakes->property("menu").value<QQuickItem *>();
+        m_flickable = m_fakes->property("flickable").value<QObject *>();
         m_logic = new PulleyMenuLogic(m_menu);
         m_logic->componentComplete();
         m_logic->setFlickable(m_flickable);
     }
 
-    void cleanup()
-    {
-        delete m_menu;
-        delete m_flickable;
-    }
+    void cleanup() { m_fakes.reset(); }
 
     void outOfBounds_data()
     {
@@ -106,12 +96,12 @@ private Q_SLOTS:
         QFETCH(bool, expected);
         QQuickItem column;
         column.setHeight(columnHeight);
-        m_menu->contentColumn = &column;
+        set(m_menu, "_contentColumn", QVariant::fromValue(&column));
         m_menu->setVisible(usable);
         m_logic->setPullDownType(pullDown);
-        m_flickable->contentY = contentY;
+        set("contentY", contentY);
         QCOMPARE(m_logic->outOfBounds(), expected);
-        m_menu->contentColumn = nullptr;
+        set(m_menu, "_contentColumn", QVariant::fromValue<QQuickItem *>(nullptr));
     }
 
     // Out of bounds activates only with a finger on the content, never while inhibited;
@@ -119,14 +109,14 @@ private Q_SLOTS:
     void activatesOnlyWhileDragging()
     {
         set("contentY", -40);
-        QVERIFY(!m_menu->active);
+        QVERIFY(!active());
         set("dragging", true);
-        QVERIFY(m_menu->active);
+        QVERIFY(active());
         set("contentY", 0);
-        QVERIFY(!m_menu->active);
-        m_menu->activationInhibited = true;
+        QVERIFY(!active());
+        set(m_menu, "_activationInhibited", true);
         set("contentY", -30);
-        QVERIFY(!m_menu->active);
+        QVERIFY(!active());
     }
 
     // A flick is watched from monitorFlick(): once faster than the snap velocity, then
@@ -159,10 +149,10 @@ private Q_SLOTS:
         QFETCH(QList<qreal>, velocities);
         QFETCH(QList<int>, states);
         QFETCH(bool, snaps);
-        m_menu->pullDown = pullDown;
-        m_menu->snapVelocity = 150;
-        m_flickable->flickDeceleration = 100;
-        m_flickable->contentY = contentY;
+        set(m_menu, "_pullDown", pullDown);
+        set(m_menu, "_snapCalculationVelocity", 150);
+        set("flickDeceleration", 100);
+        set("contentY", contentY);
         QSignalSpy animate(m_logic, &PulleyMenuLogic::animateFlick);
         m_logic->monitorFlick();
         QCOMPARE(m_logic->monitorState(), 1);
@@ -183,20 +173,17 @@ private Q_SLOTS:
         m_logic->monitorFlick();
         set("verticalVelocity", 1000);
         QCOMPARE(m_logic->monitorState(), 2);
-        set("contentY", m_menu->finalPosition);
+        set("contentY", -500); // the menu's final position
         QCOMPARE(reached.count(), 1);
         QCOMPARE(m_logic->monitorState(), 0);
     }
 
     void survivesMenuDestroyedBySnapHandler()
     {
-        m_menu->snapVelocity = 150;
-        m_flickable->flickDeceleration = 100;
-        m_flickable->contentY = 44;
-        connect(m_logic, &PulleyMenuLogic::animateFlick, this, [this] {
-            delete m_menu; // takes the logic with it
-            m_menu = nullptr;
-        });
+        set(m_menu, "_snapCalculationVelocity", 150);
+        set("flickDeceleration", 100);
+        set("contentY", 44);
+        connect(m_logic, &PulleyMenuLogic::animateFlick, this, [this] { delete m_menu; }); // and the logic with it
         QPointer<PulleyMenuLogic> logic(m_logic);
         m_logic->monitorFlick();
         set("verticalVelocity", -300);
@@ -222,14 +209,14 @@ private Q_SLOTS:
         QFETCH(bool, otherMenu);
         QFETCH(qreal, contentY);
         QFETCH(qreal, expected);
-        FakeMenu other;
+        QQuickItem other;
         m_logic->setPullDownType(pullDown);
-        m_menu->inactivePosition = pullDown ? -1000 : 5000; // never out of bounds here
-        m_flickable->contentHeight = 500; // fits the 800 px view
-        m_flickable->moving = true;
-        (pullDown ? m_flickable->pushUpMenu : m_flickable->pullDownMenu) = otherMenu ? &other : nullptr;
+        set(m_menu, "_inactivePosition", pullDown ? -1000 : 5000); // never out of bounds here
+        set("contentHeight", 500); // fits the 800 px view
+        set("moving", true);
+        set(pullDown ? "pushUpMenu" : "pullDownMenu", QVariant::fromValue<QQuickItem *>(otherMenu ? &other : nullptr));
         set("contentY", contentY);
-        QCOMPARE(m_flickable->contentY, expected);
+        QCOMPARE(position(), expected);
     }
 
     // The flickable moves content past its edge at half the finger's pace: doubled up to the
@@ -252,15 +239,15 @@ private Q_SLOTS:
         QFETCH(qreal, flickablePosition);
         QFETCH(qreal, expected);
         m_logic->setPullDownType(pullDown);
-        m_menu->pullDown = pullDown;
+        set(m_menu, "_pullDown", pullDown);
         set("dragging", true);
         set("contentY", flickablePosition);
-        QVERIFY(m_menu->active);
-        QCOMPARE(m_flickable->contentY, expected);
+        QVERIFY(active());
+        QCOMPARE(position(), expected);
         QCOMPARE(m_logic->dragDistance(), float(qAbs(expected)));
         set("dragging", false);
         set("contentY", flickablePosition);
-        QCOMPARE(m_flickable->contentY, flickablePosition);
+        QCOMPARE(position(), flickablePosition);
     }
 
     void knowsHowTheDragEnded_data()
@@ -279,7 +266,7 @@ private Q_SLOTS:
         for (int round = 0; round < 2; ++round) { // the next drag starts afresh
             set("dragging", true);
             set("contentY", -40);
-            QVERIFY(m_menu->active && !m_logic->canceled());
+            QVERIFY(active() && !m_logic->canceled());
             for (int type : events) {
                 QEvent event { QEvent::Type(type) };
                 m_logic->windowEvent(&event);
@@ -287,7 +274,7 @@ private Q_SLOTS:
             set("dragging", false);
             QCOMPARE(m_logic->canceled(), canceled);
             set("contentY", 0);
-            QVERIFY(!m_menu->active);
+            QVERIFY(!active());
         }
     }
 };
