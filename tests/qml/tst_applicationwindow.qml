@@ -8,8 +8,7 @@ import Quorvane.Pelkan.private 1.0 as Private
 // content turned and laid out in the turned size.
 Item {
     id: root
-    width: 400
-    height: 600
+    width: 400; height: 600
 
     ApplicationWindow {
         id: app

@@ -9,8 +9,7 @@ import Quorvane.Pelkan.private 1.0 as Private
 // 12- and 24-hour modes, and the value mixing behind animations.
 Item {
     id: root
-    width: 480
-    height: 1800
+    width: 480; height: 1800
 
     ButtonLayout {
         id: buttons

@@ -7,16 +7,14 @@ import Quorvane.Pelkan 1.0
 // focused field above a keyboard; and a formatting proxy model's roles in a list.
 Item {
     id: root
-    width: 480
-    height: 800
+    width: 480; height: 800
 
     property var entered: []
     property rect keyboard: Qt.rect(0, 500, 480, 300)
 
     Flickable {
         id: page
-        anchors.fill: parent
-        contentHeight: form.height
+        anchors.fill: parent; contentHeight: form.height
         VerticalAutoScroll.animated: false
         VerticalAutoScroll.keyboardRectangle: root.keyboard
 
@@ -46,9 +44,7 @@ Item {
         id: searchList
         ListView {
             id: list
-            width: 480
-            height: 400
-            model: root.cities
+            width: 480; height: 400; model: root.cities
             header: SearchField {
                 width: list.width
                 onTextChanged: list.model = root.cities.filter(function(city) { return city.toLowerCase().indexOf(text.toLowerCase()) >= 0 })

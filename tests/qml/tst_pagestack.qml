@@ -6,8 +6,7 @@ import Quorvane.Pelkan 1.0
 // and touch events), alone and in quick succession, the statuses they leave, and dialogs.
 Item {
     id: root
-    width: 400
-    height: 600
+    width: 400; height: 600
 
     property var log: []
     property var faults: []
@@ -177,8 +176,6 @@ Item {
             return [
                 { tag: "accept button", act: function(d, t) { t.mouseClick(d.header, d.width - 20, 20) }, outcome: accepted },
                 { tag: "cancel button", act: function(d, t) { t.mouseClick(d.header, 20, 20) }, outcome: rejected },
-                { tag: "accept()", act: function(d) { d.accept() }, outcome: accepted },
-                { tag: "reject()", act: function(d) { d.reject() }, outcome: rejected },
                 { tag: "swipe forward", act: function(d, t) { t.drag("touch", 380, 60) }, outcome: accepted },
                 { tag: "swipe back", act: function(d, t) { t.drag("mouse", 20, 340) }, outcome: rejected },
                 { tag: "accept() while it cannot", cannot: true, act: function(d) { d.accept() }, outcome: ["opened"] },

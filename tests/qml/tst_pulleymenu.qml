@@ -9,8 +9,7 @@ import Quorvane.Pelkan 1.0
 // pull-down menu, as a 960 px window against a label and four items at pixel ratio 2.
 Item {
     id: root
-    width: 600
-    height: Math.round((Theme.itemSizeSmall * 0.6 + 4 * Theme.itemSizeSmall * 0.75 + 2 * Theme.paddingLarge) / 0.7)
+    width: 600; height: Math.round((Theme.itemSizeSmall * 0.6 + 4 * Theme.itemSizeSmall * 0.75 + 2 * Theme.paddingLarge) / 0.7)
 
     property var log: []
     property int rows: 40
@@ -52,22 +51,16 @@ Item {
                     anchors.fill: parent
                     Flickable {
                         id: flickable
-                        width: parent.width / 3
-                        height: parent.height
-                        contentHeight: root.rows * 50
-                        property Item pullDownMenu
-                        property Item pushUpMenu
+                        width: parent.width / 3; height: parent.height; contentHeight: root.rows * 50
+                        property Item pullDownMenu; property Item pushUpMenu
                         Component.onCompleted: [downMenu, upMenu].forEach(function(menu) { menu.createObject(contentItem) })
                     }
                     ListView {
                         id: list
-                        width: parent.width / 3
-                        height: parent.height
-                        model: root.rows
+                        width: parent.width / 3; height: parent.height; model: root.rows
                         header: Rectangle { width: list.width; height: 100; color: Theme.highlightBackgroundColor }
                         delegate: Item { width: list.width; height: 50 }
-                        property Item pullDownMenu
-                        property Item pushUpMenu
+                        property Item pullDownMenu; property Item pushUpMenu
                         Component.onCompleted: [downMenu, upMenu].forEach(function(menu) { menu.createObject(list) })
                         ViewPlaceholder {
                             id: placeholder
@@ -77,14 +70,9 @@ Item {
                     }
                     GridView {
                         id: grid
-                        width: parent.width / 3
-                        height: parent.height
-                        model: root.rows
-                        cellWidth: width
-                        cellHeight: 50
+                        width: parent.width / 3; height: parent.height; model: root.rows; cellWidth: width; cellHeight: 50
                         delegate: Item { width: 50; height: 50 }
-                        property Item pullDownMenu
-                        property Item pushUpMenu
+                        property Item pullDownMenu; property Item pushUpMenu
                         Component.onCompleted: [downMenu, upMenu].forEach(function(menu) { menu.createObject(grid) })
                     }
                 }

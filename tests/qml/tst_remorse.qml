@@ -9,8 +9,7 @@ import Quorvane.Pelkan.private 1.0
 // canceled() and a warning when its row leaves the model. The overlay hides the row under it.
 Item {
     id: root
-    width: 400
-    height: 600
+    width: 400; height: 600
 
     property var log: []
     // Made here, in a scope that outlives any delegate.
@@ -27,10 +26,7 @@ Item {
         anchors.fill: parent
         ListView {
             id: view
-            width: parent.width / 2
-            height: parent.height
-            model: rows
-            cacheBuffer: 0
+            width: parent.width / 2; height: parent.height; model: rows; cacheBuffer: 0
             delegate: ListItem {
                 contentHeight: 100
                 // Row content the overlay must hide: a different colour on every other row.
@@ -42,9 +38,7 @@ Item {
         }
         ListView {
             id: numbers
-            width: parent.width / 2
-            height: parent.height
-            model: 5
+            width: parent.width / 2; height: parent.height; model: 5
             delegate: ListItem { contentHeight: 100 }
         }
     }

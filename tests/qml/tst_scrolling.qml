@@ -9,8 +9,7 @@ import Quorvane.Pelkan.private 1.0 as Private
 // offers; dragged past its top the bounce grows, within its content nothing shows.
 Item {
     id: root
-    width: 400
-    height: 600
+    width: 400; height: 600
 
     ApplicationWindow {
         id: app
@@ -24,9 +23,7 @@ Item {
                 property alias quick: quick
                 Flickable {
                     id: flickable
-                    anchors.fill: parent
-                    contentHeight: column.height
-                    boundsBehavior: Flickable.StopAtBounds
+                    anchors.fill: parent; contentHeight: column.height; boundsBehavior: Flickable.StopAtBounds
                     Column {
                         id: column
                         width: parent.width

@@ -8,17 +8,14 @@ import Quorvane.Pelkan.private 1.0 as Private
 // and the page stack takes a swipe, the sources and model edits a view follows.
 Item {
     id: root
-    width: 400
-    height: 800
+    width: 400; height: 800
 
     property int made: 0
     property int gone: 0
 
     Private.SlideableBase {
         id: view
-        width: 400
-        height: 300
-        model: 100
+        width: 400; height: 300; model: 100
         delegate: Rectangle {
             // What the view attaches, read back by the test.
             readonly property var slide: ({ index: Private.Slide.index, exposed: Private.Slide.exposed,
@@ -34,8 +31,7 @@ Item {
 
     TabView {
         id: tabs
-        y: 320
-        height: 200
+        y: 320; height: 200
         model: ["One", "Two", "Three"]
         delegate: Item {}
     }
@@ -51,9 +47,7 @@ Item {
 
     ApplicationWindow {
         id: app
-        y: 540
-        width: 400
-        height: 260
+        y: 540; width: 400; height: 260
     }
 
     Component {
@@ -62,8 +56,7 @@ Item {
             property alias view: inner
             Private.SlideableBase {
                 id: inner
-                anchors.fill: parent
-                model: 3
+                anchors.fill: parent; model: 3
                 delegate: Item {}
             }
         }

@@ -6,8 +6,7 @@ import Quorvane.Pelkan.private 1.0 as Private
 // TouchBlocker, InverseMouseArea and DragFilter with real presses.
 Item {
     id: root
-    width: 400
-    height: 600
+    width: 400; height: 600
 
     MouseArea {
         id: below
@@ -55,9 +54,7 @@ Item {
             MouseArea {
                 id: slider
                 property int moves: 0
-                y: 200
-                width: parent.width
-                height: 100
+                y: 200; width: parent.width; height: 100
                 Private.DragFilter.orientations: Qt.Horizontal
                 onPositionChanged: moves++
             }
