@@ -121,9 +121,6 @@ private Q_SLOTS:
         QVERIFY(writeFile(path(QStringLiteral("bomb.png")), declaring(46341, 46341)));
         QVERIFY(writeFile(path(QStringLiteral("wide.png")), declaring(23200, 23200)));
         QVERIFY(::mkfifo(QFile::encodeName(path(QStringLiteral("fifo.png"))).constData(), 0600) == 0);
-        QImage tiny(2, 1, QImage::Format_RGB32);
-        tiny.fill(Qt::red);
-        QVERIFY(tiny.save(path(QStringLiteral("tiny.png"))));
         m_providers.insert(QStringLiteral("theme"), new DeclarativeImageProvider);
         m_providers.insert(QStringLiteral("transientimage"), new TransientImageProvider);
         m_providers.insert(QStringLiteral("pelkan-background"), new BackgroundImageProvider);
@@ -188,9 +185,7 @@ private Q_SLOTS:
                                            + QUrl::fromLocalFile(path(QStringLiteral("broken.png"))).toEncoded() + "' } }\n");
         QVERIFY(root);
         QTRY_COMPARE(root->property("broken").value<QObject *>()->property("status").toInt(), 3); // Image.Error
-        QImage grab;
-        QTRY_VERIFY((grab = view.grabWindow(), qRed(grab.pixel(40, 25)) > 240 && qGreen(grab.pixel(40, 25)) < 16));
-        QCOMPARE(grab.pixel(90, 90), qRgb(0, 0, 0));
+        QCOMPARE(pixelsDiffer(view, { { { 40, 25 }, qRgb(255, 0, 0) }, { { 90, 90 }, qRgb(0, 0, 0) } }, 15), QString());
     }
 
     void decodedImageAfterTexture()
@@ -350,9 +345,9 @@ private Q_SLOTS:
             QTest::addRow("%s: device", provider) << p << "/dev/zero" << QSize() << notRegular.arg("/dev/zero") << QSize();
         }
         const QSize huge(1000000, 1000000);
-        QTest::newRow("theme: huge size asked") << "theme" << "tiny.png" << huge << "" << QSize(8194, 8194); // with its border
-        QTest::newRow("transientimage: huge size asked") << "transientimage" << "tiny.png" << huge << "" << QSize(8192, 8192);
-        QTest::newRow("pelkan-background: one huge side asked") << "pelkan-background" << "tiny.png" << QSize(0, 2000000) << ""
+        QTest::newRow("theme: huge size asked") << "theme" << "red.png" << huge << "" << QSize(8194, 8194); // with its border
+        QTest::newRow("transientimage: huge size asked") << "transientimage" << "red.png" << huge << "" << QSize(8192, 8192);
+        QTest::newRow("pelkan-background: one huge side asked") << "pelkan-background" << "red.png" << QSize(0, 2000000) << ""
                                                                 << QSize(16384, 8192);
     }
 
