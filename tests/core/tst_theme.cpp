@@ -1,9 +1,13 @@
 #include "../common/configfixture.h"
+#include "control.h"
 #include "mgconfitem.h"
+#include "palette.h"
 #include "theme.h"
 
 #include <QGuiApplication>
 #include <QTemporaryDir>
+#include <map>
+#include <memory>
 #include <QtTest>
 
 using Pelkan::Theme;
@@ -11,60 +15,6 @@ using Pelkan::Theme;
 static QString key(const char *name)
 {
     return Theme::configurationPath() + QLatin1String(name);
-}
-
-class tst_Theme : public QObject
-{
-    Q_OBJECT
-
-private Q_SLOTS:
-    void init()
-    {
-        QVERIFY(ConfigFixture::reset(Theme::configurationPath()));
-        QVERIFY(ConfigFixture::write(key("pixel_ratio"), QStringLiteral("1.0")));
-        QTRY_COMPARE(Theme::instance()->pixelRatio(), 1.0);
-    }
-    void cleanupTestCase() { ConfigFixture::reset(Theme::configurationPath()); }
-
-    void metricsScaleWithPixelRatio_data();
-    void metricsScaleWithPixelRatio();
-    void refusedValues_data();
-    void refusedValues();
-    void colourFollowsConfiguration();
-    void derivedColoursFollowTheirBase();
-    void colourSchemeChangesDefaults();
-    void themeDirectory();
-    void highlightText_data();
-    void highlightText();
-};
-
-void tst_Theme::metricsScaleWithPixelRatio_data()
-{
-    QTest::addColumn<QString>("ratio");
-    QTest::addColumn<qreal>("scale");
-    QTest::newRow("1.5") << "1.5" << 1.5;
-    QTest::newRow("2.0") << "2.0" << 2.0;
-    QTest::newRow("integer 3") << "3" << 3.0;
-}
-
-void tst_Theme::metricsScaleWithPixelRatio()
-{
-    QFETCH(QString, ratio);
-    QFETCH(qreal, scale);
-    Theme theme;
-    const qreal small = theme.itemSizeSmall();
-    const qreal margin = theme.horizontalPageMargin();
-    const QSize cover = theme.coverSizeLarge();
-    QSignalSpy changed(&theme, &Theme::pixelRatioChanged);
-    QSignalSpy colourChanged(&theme, &Theme::primaryColorChanged);
-
-    QVERIFY(ConfigFixture::write(key("pixel_ratio"), ratio));
-    QTRY_COMPARE(changed.count(), 1);
-    QCOMPARE(theme.pixelRatio(), scale);
-    QCOMPARE(theme.itemSizeSmall(), small * scale);
-    QCOMPARE(theme.horizontalPageMargin(), margin * scale);
-    QCOMPARE(theme.coverSizeLarge(), QSize(qRound(cover.width() * scale), qRound(cover.height() * scale)));
-    QCOMPARE(colourChanged.count(), 0);
 }
 
 namespace {
@@ -76,168 +26,286 @@ void collectWarnings(QtMsgType type, const QMessageLogContext &, const QString &
 }
 } // namespace
 
-void tst_Theme::refusedValues_data()
+class tst_Theme : public QObject
 {
-    QTest::addColumn<QByteArray>("name");
-    QTest::addColumn<QString>("value");
-    QTest::addColumn<QString>("warning");
-    const QString ratio = QStringLiteral("^Theme: ignoring invalid pixel ratio");
-    const QString directory = QStringLiteral("^Theme: ignoring invalid theme directory");
-    QTest::newRow("ratio negative") << QByteArray("pixel_ratio") << "-1.0" << ratio;
-    QTest::newRow("ratio zero") << QByteArray("pixel_ratio") << "0.0" << ratio;
-    QTest::newRow("ratio 0.001") << QByteArray("pixel_ratio") << "0.001" << ratio;
-    QTest::newRow("ratio 100") << QByteArray("pixel_ratio") << "100.0" << ratio;
-    QTest::newRow("ratio text") << QByteArray("pixel_ratio") << "'big'" << ratio;
-    QTest::newRow("ratio boolean") << QByteArray("pixel_ratio") << "true" << ratio;
-    QTest::newRow("directory /proc/self") << QByteArray("directory") << "'/proc/self'" << directory;
-    QTest::newRow("directory relative") << QByteArray("directory") << "'../..'" << directory;
-    QTest::newRow("directory boolean") << QByteArray("directory") << "true" << directory;
-    QTest::newRow("directory missing") << QByteArray("directory") << "'/nonexistent/theme'"
-                                       << "^Theme: ignoring missing theme directory";
-    QTest::newRow("scheme boolean") << QByteArray("color_scheme") << "true" << "^Theme: ignoring invalid colour scheme";
-    QTest::newRow("colour text") << QByteArray("highlight_color") << "'not a colour'"
-                                 << "^Theme: ignoring invalid colour.*highlight_color";
-    QTest::newRow("colour number") << QByteArray("highlight_color") << "5" << "^Theme: ignoring invalid colour.*highlight_color";
-}
+    Q_OBJECT
 
-// A refused value leaves the default in place, and is warned about once: not again when
-// another key changes.
-void tst_Theme::refusedValues()
-{
-    QFETCH(QByteArray, name);
-    QFETCH(QString, value);
-    QFETCH(QString, warning);
-    MGConfItem item(key(name.constData()));
-    QVERIFY(ConfigFixture::reset(key(name.constData())));
-    QTRY_VERIFY(!item.value().isValid()); // the themes have heard of it too
-    Theme theme; // with the key's default
-    const qreal ratio = theme.pixelRatio();
-    const QString directory = theme.themeDirectory();
-    const QColor highlight = theme.highlightColor();
-    const Theme::ColorScheme scheme = theme.colorScheme();
-    QSignalSpy primaryChanged(&theme, &Theme::primaryColorChanged);
+private Q_SLOTS:
+    void init()
+    {
+        QVERIFY(ConfigFixture::reset(Theme::configurationPath()));
+        QVERIFY(ConfigFixture::write(key("pixel_ratio"), QStringLiteral("1.0")));
+        QTRY_COMPARE(Theme::instance()->pixelRatio(), 1.0);
+        QTRY_COMPARE(Theme::instance()->primaryColor(), QColor(Qt::white)); // the last row's key gone too
+    }
 
-    s_warnings.clear();
-    const QtMessageHandler previous = qInstallMessageHandler(collectWarnings);
-    const QRegularExpression pattern(warning);
-    auto matching = [&pattern] { return s_warnings.filter(pattern).size(); };
-    const bool written = ConfigFixture::write(key(name.constData()), value);
-    QTRY_VERIFY(matching() >= 1); // this theme's and Theme::instance()'s, once each
-    const int warned = matching();
-    QVERIFY(ConfigFixture::write(key("primary_color"), QStringLiteral("'#123456'")));
-    QTRY_COMPARE(primaryChanged.count(), 1);
-    QTest::qWait(50);
-    qInstallMessageHandler(previous);
+    void cleanupTestCase() { ConfigFixture::reset(Theme::configurationPath()); }
 
-    QVERIFY(written);
-    QCOMPARE(matching(), warned);
-    QVERIFY(warned <= 2);
-    QCOMPARE(theme.pixelRatio(), ratio);
-    QCOMPARE(theme.themeDirectory(), directory);
-    QCOMPARE(theme.highlightColor(), highlight);
-    QCOMPARE(theme.colorScheme(), scheme);
-}
+    void metricsScaleWithPixelRatio_data()
+    {
+        QTest::addColumn<QString>("ratio");
+        QTest::addColumn<qreal>("scale");
+        QTest::newRow("1.5") << "1.5" << 1.5;
+        QTest::newRow("2.0") << "2.0" << 2.0;
+        QTest::newRow("integer 3") << "3" << 3.0;
+    }
 
-void tst_Theme::colourFollowsConfiguration()
-{
-    Theme theme;
-    QSignalSpy primary(&theme, &Theme::primaryColorChanged);
-    QSignalSpy highlight(&theme, &Theme::highlightColorChanged);
-    QSignalSpy metrics(&theme, &Theme::pixelRatioChanged);
+    void metricsScaleWithPixelRatio()
+    {
+        QFETCH(QString, ratio);
+        QFETCH(qreal, scale);
+        Theme theme;
+        const qreal small = theme.itemSizeSmall();
+        const qreal margin = theme.horizontalPageMargin();
+        const QSize cover = theme.coverSizeLarge();
+        QSignalSpy changed(&theme, &Theme::pixelRatioChanged);
+        QSignalSpy colourChanged(&theme, &Theme::primaryColorChanged);
 
-    QVERIFY(ConfigFixture::write(key("primary_color"), QStringLiteral("'#ff0000'")));
-    QTRY_COMPARE(primary.count(), 1);
-    QCOMPARE(theme.primaryColor(), QColor(Qt::red));
-    QCOMPARE(highlight.count(), 0);
-    QCOMPARE(metrics.count(), 0);
+        QVERIFY(ConfigFixture::write(key("pixel_ratio"), ratio));
+        QTRY_COMPARE(changed.count(), 1);
+        QCOMPARE(theme.pixelRatio(), scale);
+        QCOMPARE(theme.itemSizeSmall(), small * scale);
+        QCOMPARE(theme.horizontalPageMargin(), margin * scale);
+        QCOMPARE(theme.coverSizeLarge(), QSize(qRound(cover.width() * scale), qRound(cover.height() * scale)));
+        QCOMPARE(colourChanged.count(), 0);
+    }
 
-    // The process-wide instance follows the same key.
-    QTRY_COMPARE(Theme::instance()->primaryColor(), QColor(Qt::red));
+    void refusedValues_data()
+    {
+        QTest::addColumn<QByteArray>("name");
+        QTest::addColumn<QString>("value");
+        QTest::addColumn<QString>("warning");
+        const QString ratio = QStringLiteral("^Theme: ignoring invalid pixel ratio");
+        const QString directory = QStringLiteral("^Theme: ignoring invalid theme directory");
+        QTest::newRow("ratio negative") << QByteArray("pixel_ratio") << "-1.0" << ratio;
+        QTest::newRow("ratio zero") << QByteArray("pixel_ratio") << "0.0" << ratio;
+        QTest::newRow("ratio 0.001") << QByteArray("pixel_ratio") << "0.001" << ratio;
+        QTest::newRow("ratio 100") << QByteArray("pixel_ratio") << "100.0" << ratio;
+        QTest::newRow("ratio text") << QByteArray("pixel_ratio") << "'big'" << ratio;
+        QTest::newRow("ratio boolean") << QByteArray("pixel_ratio") << "true" << ratio;
+        QTest::newRow("directory /proc/self") << QByteArray("directory") << "'/proc/self'" << directory;
+        QTest::newRow("directory relative") << QByteArray("directory") << "'../..'" << directory;
+        QTest::newRow("directory boolean") << QByteArray("directory") << "true" << directory;
+        QTest::newRow("directory missing") << QByteArray("directory") << "'/nonexistent/theme'"
+                                           << "^Theme: ignoring missing theme directory";
+        QTest::newRow("scheme boolean") << QByteArray("color_scheme") << "true" << "^Theme: ignoring invalid colour scheme";
+        QTest::newRow("colour text") << QByteArray("highlight_color") << "'not a colour'"
+                                     << "^Theme: ignoring invalid colour.*highlight_color";
+        QTest::newRow("colour number") << QByteArray("highlight_color") << "5" << "^Theme: ignoring invalid colour.*highlight_color";
+    }
 
-    QVERIFY(ConfigFixture::reset(key("primary_color")));
-    QTRY_COMPARE(primary.count(), 2);
-    QCOMPARE(theme.primaryColor(), QColor(Qt::white));
-}
+    // A refused value leaves the default in place, and is warned about once: not again when
+    // another key changes.
+    void refusedValues()
+    {
+        QFETCH(QByteArray, name);
+        QFETCH(QString, value);
+        QFETCH(QString, warning);
+        MGConfItem item(key(name.constData()));
+        QVERIFY(ConfigFixture::reset(key(name.constData())));
+        QTRY_VERIFY(!item.value().isValid()); // the themes have heard of it too
+        Theme theme; // with the key's default
+        const qreal ratio = theme.pixelRatio();
+        const QString directory = theme.themeDirectory();
+        const QColor highlight = theme.highlightColor();
+        const Theme::ColorScheme scheme = theme.colorScheme();
+        QSignalSpy primaryChanged(&theme, &Theme::primaryColorChanged);
 
-void tst_Theme::derivedColoursFollowTheirBase()
-{
-    Theme theme;
-    QSignalSpy secondary(&theme, &Theme::secondaryColorChanged);
-    QSignalSpy highlightBackground(&theme, &Theme::highlightBackgroundColorChanged);
+        s_warnings.clear();
+        const QtMessageHandler previous = qInstallMessageHandler(collectWarnings);
+        const QRegularExpression pattern(warning);
+        auto matching = [&pattern] { return s_warnings.filter(pattern).size(); };
+        const bool written = ConfigFixture::write(key(name.constData()), value);
+        QTRY_VERIFY(matching() >= 1); // this theme's and Theme::instance()'s, once each
+        const int warned = matching();
+        QVERIFY(ConfigFixture::write(key("primary_color"), QStringLiteral("'#123456'")));
+        QTRY_COMPARE(primaryChanged.count(), 1);
+        QTest::qWait(50);
+        qInstallMessageHandler(previous);
 
-    QVERIFY(ConfigFixture::write(key("highlight_color"), QStringLiteral("'#00ff00'")));
-    QTRY_COMPARE(highlightBackground.count(), 1);
-    QCOMPARE(theme.highlightBackgroundColor(), QColor(Qt::green));
-    QCOMPARE(theme.secondaryHighlightColor().rgb(), QColor(Qt::green).rgb());
-    QCOMPARE(theme.secondaryHighlightColor().alphaF(), 0.6);
-    QCOMPARE(secondary.count(), 0);
+        QVERIFY(written);
+        QCOMPARE(matching(), warned);
+        QVERIFY(warned <= 2);
+        QCOMPARE(theme.pixelRatio(), ratio);
+        QCOMPARE(theme.themeDirectory(), directory);
+        QCOMPARE(theme.highlightColor(), highlight);
+        QCOMPARE(theme.colorScheme(), scheme);
+    }
 
-    // An explicit secondary highlight colour wins over the derived one.
-    QVERIFY(ConfigFixture::write(key("secondary_highlight_color"), QStringLiteral("'#80112233'")));
-    QTRY_COMPARE(theme.secondaryHighlightColor(), QColor(QStringLiteral("#80112233")));
-}
+    // A key written from outside reaches a theme made before it and the process's theme: the
+    // values follow, each changed value announced once and nothing else; a reset brings back
+    // what was, announced again.
+    void liveChanges_data()
+    {
+        QTest::addColumn<QByteArray>("name");
+        QTest::addColumn<QString>("value");
+        QTest::addColumn<QVariantMap>("values");
+        QTest::addColumn<QStringList>("changed"); // the signals sent
+        const QString custom = m_custom.path();
+        QTest::newRow("primary colour, and the secondary from it")
+                << QByteArray("primary_color") << "'#ff0000'" << QVariantMap { { "primaryColor", QColor(Qt::red) } }
+                << QStringList { "primaryColorChanged", "secondaryColorChanged" };
+        QTest::newRow("highlight colour, and the colours from it")
+                << QByteArray("highlight_color") << "'#00ff00'"
+                << QVariantMap { { "highlightBackgroundColor", QColor(Qt::green) }, { "secondaryHighlightColor", QColor::fromRgbF(0, 1, 0, 0.6) } }
+                << QStringList { "highlightColorChanged", "highlightBackgroundColorChanged", "secondaryHighlightColorChanged" };
+        QTest::newRow("a secondary highlight colour given wins")
+                << QByteArray("secondary_highlight_color") << "'#80112233'"
+                << QVariantMap { { "secondaryHighlightColor", QColor(QStringLiteral("#80112233")) } } << QStringList { "secondaryHighlightColorChanged" };
+        QTest::newRow("dark on light: every colour, the window light under dark text")
+                << QByteArray("color_scheme") << "'darkonlight'"
+                << QVariantMap { { "colorScheme", QVariant::fromValue(Theme::DarkOnLight) }, { "primaryColor", QColor(Qt::black) },
+                                 { "overlayBackgroundColor", QColor(Qt::white) }, { "backgroundColor", QColor(0xf4, 0xf6, 0xfa) } }
+                << QStringList { "colorSchemeChanged", "primaryColorChanged", "secondaryColorChanged", "highlightColorChanged",
+                                 "secondaryHighlightColorChanged", "highlightBackgroundColorChanged", "overlayBackgroundColorChanged",
+                                 "errorColorChanged", "backgroundColorChanged" };
+        QTest::newRow("theme directory") << QByteArray("directory") << "'" + custom + "'" << QVariantMap { { "themeDirectory", custom } }
+                                         << QStringList { "themeDirectoryChanged" };
+    }
 
-void tst_Theme::colourSchemeChangesDefaults()
-{
-    Theme theme;
-    QCOMPARE(theme.colorScheme(), Theme::LightOnDark);
-    QSignalSpy scheme(&theme, &Theme::colorSchemeChanged);
-    QSignalSpy primary(&theme, &Theme::primaryColorChanged);
-    QSignalSpy overlay(&theme, &Theme::overlayBackgroundColorChanged);
-    QSignalSpy error(&theme, &Theme::errorColorChanged);
-    QSignalSpy background(&theme, &Theme::backgroundColorChanged);
-    const QColor lightBackground = theme.backgroundColor();
+    void liveChanges()
+    {
+        QFETCH(QByteArray, name);
+        QFETCH(QString, value);
+        QFETCH(QVariantMap, values);
+        QFETCH(QStringList, changed);
+        Theme theme;
+        QVERIFY(QFileInfo(theme.themeDirectory() + QLatin1String("/icons")).isDir()); // the built-in theme
+        QVariantMap before;
+        std::map<QString, std::unique_ptr<QSignalSpy>> spies;
+        const QMetaObject *meta = theme.metaObject();
+        for (int i = meta->propertyOffset(); i < meta->propertyCount(); ++i) {
+            const QMetaMethod notify = meta->property(i).notifySignal();
+            before.insert(QLatin1String(meta->property(i).name()), meta->property(i).read(&theme));
+            if (!spies.count(QLatin1String(notify.name())))
+                spies[QLatin1String(notify.name())].reset(new QSignalSpy(&theme, notify));
+        }
+        auto sent = [&](int times) {
+            QStringList wrong;
+            for (const auto &spy : spies) {
+                if (spy.second->count() != (changed.contains(spy.first) ? times : 0))
+                    wrong << QStringLiteral("%1 %2 times").arg(spy.first).arg(spy.second->count());
+            }
+            return wrong.join(QLatin1String(", "));
+        };
+        QVERIFY(ConfigFixture::write(key(name.constData()), value));
+        for (auto it = values.cbegin(); it != values.cend(); ++it) {
+            QTRY_COMPARE(theme.property(it.key().toLatin1()), it.value());
+            QTRY_COMPARE(Theme::instance()->property(it.key().toLatin1()), it.value());
+        }
+        QTest::qWait(50);
+        QCOMPARE(sent(1), QString());
+        QVERIFY(ConfigFixture::reset(key(name.constData())));
+        for (auto it = before.cbegin(); it != before.cend(); ++it)
+            QTRY_COMPARE(theme.property(it.key().toLatin1()), it.value());
+        QCOMPARE(sent(2), QString());
+    }
 
-    QVERIFY(ConfigFixture::write(key("color_scheme"), QStringLiteral("'darkonlight'")));
-    QTRY_COMPARE(scheme.count(), 1);
-    QCOMPARE(theme.colorScheme(), Theme::DarkOnLight);
-    QCOMPARE(theme.primaryColor(), QColor(Qt::black));
-    QCOMPARE(theme.overlayBackgroundColor(), QColor(Qt::white));
-    QCOMPARE(primary.count(), 1);
-    QCOMPARE(overlay.count(), 1);
-    // A window of each scheme has its own background and error colour: light under dark text.
-    QCOMPARE(error.count(), 1);
-    QCOMPARE(background.count(), 1);
-    QVERIFY(theme.backgroundColor().lightness() > 200 && lightBackground.lightness() < 50);
-}
+    void highlightText_data()
+    {
+        QTest::addColumn<QString>("text");
+        QTest::addColumn<QString>("pattern");
+        QTest::addColumn<QString>("expected");
+        const QString f = QStringLiteral("<font color=\"#ffff0000\">");
+        QTest::newRow("no pattern") << "a<b" << "" << "a&lt;b";
+        QTest::newRow("no match") << "hello" << "x" << "hello";
+        QTest::newRow("case insensitive, keeps case") << "Hello hello" << "HELLO"
+                                                    << f + "Hello</font> " + f + "hello</font>";
+        QTest::newRow("escapes inside and outside") << "<a&b>" << "&" << "&lt;a" + f + "&amp;</font>b&gt;";
+    }
 
-void tst_Theme::themeDirectory()
-{
-    Theme theme;
-    QVERIFY(QFileInfo(theme.themeDirectory() + QLatin1String("/icons")).isDir());
-    const QString builtIn = theme.themeDirectory();
+    void highlightText()
+    {
+        QFETCH(QString, text);
+        QFETCH(QString, pattern);
+        QFETCH(QString, expected);
+        QCOMPARE(Theme::instance()->highlightText(text, pattern, Qt::red), expected);
+    }
 
-    QTemporaryDir custom;
-    QSignalSpy changed(&theme, &Theme::themeDirectoryChanged);
-    QVERIFY(ConfigFixture::write(key("directory"), QLatin1Char('\'') + custom.path() + QLatin1Char('\'')));
-    QTRY_COMPARE(changed.count(), 1);
-    QCOMPARE(theme.themeDirectory(), custom.path());
+    // A palette's colours: the theme's until set (announced once), its parent's until set.
+    void paletteFollowsThemeUntilSet_data()
+    {
+        QTest::addColumn<int>("role");
+        QTest::addColumn<QByteArray>("property");
+        for (int role = 0; role < Theme::ColorRoleCount; ++role) {
+            const QByteArray name = QMetaEnum::fromType<Theme::ColorRole>().valueToKey(role);
+            QByteArray property = name;
+            property[0] = QChar::toLower(uint(property[0]));
+            QTest::newRow(name) << role << property;
+        }
+    }
 
-    QVERIFY(ConfigFixture::reset(key("directory")));
-    QTRY_COMPARE(changed.count(), 2);
-    QCOMPARE(theme.themeDirectory(), builtIn);
-}
+    void paletteFollowsThemeUntilSet()
+    {
+        QFETCH(int, role);
+        QFETCH(QByteArray, property);
+        Pelkan::Palette palette;
+        QCOMPARE(palette.property(property).value<QColor>(), Theme::instance()->color(Theme::ColorRole(role)));
 
-void tst_Theme::highlightText_data()
-{
-    QTest::addColumn<QString>("text");
-    QTest::addColumn<QString>("pattern");
-    QTest::addColumn<QString>("expected");
-    const QString f = QStringLiteral("<font color=\"#ffff0000\">");
-    QTest::newRow("no pattern") << "a<b" << "" << "a&lt;b";
-    QTest::newRow("no match") << "hello" << "x" << "hello";
-    QTest::newRow("case insensitive, keeps case") << "Hello hello" << "HELLO"
-                                                << f + "Hello</font> " + f + "hello</font>";
-    QTest::newRow("escapes inside and outside") << "<a&b>" << "&" << "&lt;a" + f + "&amp;</font>b&gt;";
-}
+        QSignalSpy changed(&palette, palette.metaObject()->property(palette.metaObject()->indexOfProperty(property)).notifySignal());
+        QVERIFY(palette.setProperty(property, QColor(1, 2, 3)));
+        QCOMPARE(palette.property(property).value<QColor>(), QColor(1, 2, 3));
+        QCOMPARE(changed.count(), 1);
+        QVERIFY(palette.isSet(Theme::ColorRole(role)));
 
-void tst_Theme::highlightText()
-{
-    QFETCH(QString, text);
-    QFETCH(QString, pattern);
-    QFETCH(QString, expected);
-    QCOMPARE(Theme::instance()->highlightText(text, pattern, Qt::red), expected);
-}
+        // Setting the same colour again announces nothing.
+        palette.setProperty(property, QColor(1, 2, 3));
+        QCOMPARE(changed.count(), 1);
+
+        QVERIFY(palette.metaObject()->property(palette.metaObject()->indexOfProperty(property)).reset(&palette));
+        QCOMPARE(palette.property(property).value<QColor>(), Theme::instance()->color(Theme::ColorRole(role)));
+        QCOMPARE(changed.count(), 2);
+        QVERIFY(!palette.isSet(Theme::ColorRole(role)));
+    }
+
+    // A child palette shows its parent's colours, announced, until it sets its own; once the
+    // parent goes, the theme's.
+    void paletteInheritsFromParent()
+    {
+        Pelkan::Palette child;
+        QSignalSpy highlight(&child, &Pelkan::Palette::highlightColorChanged);
+        QSignalSpy primary(&child, &Pelkan::Palette::primaryColorChanged);
+        {
+            Pelkan::Palette parent;
+            child.setInheritedPalette(&parent);
+            parent.setHighlightColor(Qt::magenta);
+            QCOMPARE(child.highlightColor(), QColor(Qt::magenta));
+            QCOMPARE(highlight.count(), 1);
+            QCOMPARE(primary.count(), 0);
+            child.setHighlightColor(Qt::cyan);
+            parent.setHighlightColor(Qt::yellow);
+            parent.setPrimaryColor(Qt::magenta);
+            QCOMPARE(child.highlightColor(), QColor(Qt::cyan));
+            QCOMPARE(child.primaryColor(), QColor(Qt::magenta));
+            QCOMPARE(highlight.count(), 2);
+            parent.setColorScheme(Theme::DarkOnLight);
+            QCOMPARE(child.colorScheme(), Theme::DarkOnLight);
+        }
+        QVERIFY(!child.inheritedPalette());
+        QCOMPARE(child.primaryColor(), Theme::instance()->primaryColor());
+    }
+
+    // A control takes the palette of its nearest ancestor control, through plain items and
+    // also when the plain item joins later; moved out, it follows the theme again.
+    void paletteOfNearestAncestorControl()
+    {
+        Pelkan::Control page;
+        QQuickItem plain(&page), container;
+        Pelkan::Control button(&plain), later(&container);
+        QCOMPARE(button.palette()->inheritedPalette(), page.palette());
+        QVERIFY(!later.palette()->inheritedPalette());
+        container.setParentItem(&page);
+        QCOMPARE(later.palette()->inheritedPalette(), page.palette());
+        page.palette()->setHighlightColor(Qt::magenta);
+        QCOMPARE(button.palette()->highlightColor(), QColor(Qt::magenta));
+        button.setParentItem(nullptr);
+        QVERIFY(!button.palette()->inheritedPalette());
+        QCOMPARE(button.palette()->highlightColor(), Theme::instance()->highlightColor());
+    }
+
+private:
+    QTemporaryDir m_custom;
+};
 
 QTEST_MAIN(tst_Theme)
 #include "tst_theme.moc"

@@ -8,8 +8,7 @@ import Quorvane.Pelkan.private 1.0 as Private
 // content turned and laid out in the turned size.
 Item {
     id: root
-    width: 400
-    height: 600
+    width: 400; height: 600
 
     ApplicationWindow {
         id: app
@@ -97,21 +96,35 @@ Item {
             wait(0)
         }
 
-        // A popup counting down shows in the overlay over a frosted capture of the pages,
-        // and goes home when done; the capture stops with it.
-        function test_popupInOverlay() {
+        // A remorse popup counts down in the overlay over a frosted capture of the pages, runs
+        // its action unless tapped, and goes home when done; the capture stops with it.
+        function test_remorsePopup_data() {
+            return [
+                { tag: "runs after the countdown", log: ["cleared"] },
+                { tag: "cancelled by a tap", tap: true, log: [] },
+            ]
+        }
+
+        function test_remorsePopup(data) {
             app.deviceOrientation = Orientation.Portrait
             app.pageStack.clear()
             var page = app.pageStack.push(remorsePage, {}, PageStackAction.Immediate)
             var popup = page.popup
-            popup.execute("Clearing", function() {}, 10000)
+            var log = []
+            popup.execute("Clearing", function() { log.push("cleared") }, 300)
+            compare(popup.description, "Clearing in 1 s, tap to cancel")
+            verify(popup.visible)
             compare(popup.parent, app.overlay)
             compare(popup.width, page.width)
             var source = popup.Private.OverlayBackground.source
             verify(source !== null)
             compare(popup.Private.OverlayBackground.background.backdrop, source)
             verify(source.active)
-            popup.cancel()
+            if (data.tap)
+                mouseClick(popup, 20, 20)
+            wait(600)
+            compare(log, data.log)
+            verify(!popup.visible)
             compare(popup.parent, page)
             verify(!source.active)
         }

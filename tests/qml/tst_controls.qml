@@ -6,17 +6,14 @@ import Quorvane.Pelkan.private 1.0 as Private
 // Controls with real keys, taps and drags: keys of each control (also mirrored), Tab order,
 // presses, press-and-hold, checkable and repeating buttons, the slider under a finger in a
 // flickable, the palette a page hands down; buttons laid out in rows, time picker wheels in
-// 12- and 24-hour modes, and the value mixing and string-list models they are built on.
+// 12- and 24-hour modes, and the value mixing behind animations.
 Item {
     id: root
-    width: 480
-    height: 1800
+    width: 480; height: 1800
 
     ButtonLayout {
         id: buttons
-        width: 400
-        columnSpacing: 10
-        rowSpacing: 5
+        width: 400; columnSpacing: 10; rowSpacing: 5
         Item { id: b0; implicitWidth: 100; implicitHeight: 30 }
         Item { id: b1; implicitWidth: 120; implicitHeight: 30 }
         Item { id: b2; implicitWidth: 80; implicitHeight: 30 }
@@ -24,10 +21,7 @@ Item {
 
     Page {
         id: page
-        y: 100
-        width: root.width
-        height: 1200
-
+        y: 100; width: root.width; height: 1200
         Column {
             id: controls
             width: root.width
@@ -46,20 +40,14 @@ Item {
 
     Flickable {
         id: flick
-        y: 1400
-        width: root.width
-        height: 300
-        contentHeight: 2000
+        y: 1400; width: root.width; height: 300; contentHeight: 2000
         Slider { id: flickSlider; y: 100; minimumValue: 0; maximumValue: 100; stepSize: 25 }
     }
 
     Private.VariantInterpolator { id: mix }
-    Private.StringListModel { id: strings; strings: ["a", "b", "c"] }
-    ListView { id: view; y: 1710; width: 100; height: 80; model: strings; delegate: Text { height: 20; text: display } }
 
-    TestCase {
+    GestureTestCase {
         name: "Controls"
-        when: windowShown
 
         // Rows of equal widths (the widest in the row), centred, stacked.
         function test_buttonLayout_data() {
@@ -237,18 +225,10 @@ Item {
             var released = 0
             var count = function() { ++released }
             flickSlider.released.connect(count)
-            var press = function(x, y) { data.input === "touch" ? touchEvent(flickSlider).press(0, flickSlider, x, y).commit() : mousePress(flickSlider, x, y) }
-            var move = function(x, y) { data.input === "touch" ? touchEvent(flickSlider).move(0, flickSlider, x, y).commit() : mouseMove(flickSlider, x, y) }
-            var release = function(x, y) { data.input === "touch" ? touchEvent(flickSlider).release(0, flickSlider, x, y).commit() : mouseRelease(flickSlider, x, y) }
-            if (data.taps) {
-                data.taps.forEach(function(p) { press(at(p), y); release(at(p), y) })
-            } else {
-                var x = at(data.from)
-                press(x, y)
-                for (var i = 1; i <= 10; ++i)
-                    move(data.to !== undefined ? x + (at(data.to) - x) * i / 10 : x, y + (data.down || 0) * i / 10)
-                release(data.to !== undefined ? at(data.to) : x, y + (data.down || 0))
-            }
+            if (data.taps)
+                data.taps.forEach(function(p) { swipe(flickSlider, data.input, at(p), y, at(p), y, { steps: 1 }) })
+            else
+                swipe(flickSlider, data.input, at(data.from), y, at(data.to !== undefined ? data.to : data.from), y + (data.down || 0))
             flickSlider.released.disconnect(count)
             compare(flickSlider.value, data.value)
             compare(released, data.released)
@@ -276,6 +256,7 @@ Item {
             compare(String(control.palette.highlightColor), String(Theme.highlightColor))
         }
 
+        // A tap opens the menu under the row; a tap on its second entry picks it.
         function test_comboBox() {
             var activated = []
             combo.activated.connect(function(i) { activated.push(i) })
@@ -283,7 +264,6 @@ Item {
             mouseClick(combo, combo.width / 2, Theme.itemSizeSmall / 2)
             verify(combo.menuOpen)
             waitForRendering(combo) // the menu's column laid out
-            // Second entry of the menu under the row.
             mouseClick(combo, combo.width / 2, combo.height - (combo.height - Theme.itemSizeSmall) / 2)
             verify(!combo.menuOpen)
             compare(combo.currentIndex, 1)
@@ -312,9 +292,8 @@ Item {
             compare(wheels.length, data.wheels)
             compare(wheels[0].count, data.mode === DateTime.TwelveHours ? 12 : 24)
             var wheel = wheels[data.wheel]
-            // The entry just under the current one, in view.
             wheel.forceLayout()
-            // The wheel turns to the current entry first; a tap while it turns only stops it.
+            // The wheel turns to the current entry first (a tap while it turns only stops it).
             tryCompare(wheel, "contentY", (wheel.currentIndex - 1) * wheel.itemHeight)
             var entry = wheel.itemAtIndex(data.entry)
             mouseClick(entry)
@@ -353,32 +332,6 @@ Item {
                        && Math.abs(mix.value.a - 0.5) < 0.01, String(mix.value))
             else
                 compare(mix.value, data.value)
-        }
-
-        function test_stringListModel_data() {
-            return [
-                { tag: "append", edit: function() { strings.append("d") }, shown: ["a", "b", "c", "d"] },
-                { tag: "insert", edit: function() { strings.insert(1, "x") }, shown: ["a", "x", "b", "c"] },
-                { tag: "remove two", edit: function() { strings.remove(0, 2) }, shown: ["c"] },
-                { tag: "move down", edit: function() { strings.move(0, 2) }, shown: ["b", "c", "a"] },
-                { tag: "move up", edit: function() { strings.move(2, 0) }, shown: ["c", "a", "b"] },
-                { tag: "set", edit: function() { strings.set(1, "y") }, shown: ["a", "y", "c"] },
-                { tag: "out of range: nothing", edit: function() { strings.remove(5) }, shown: ["a", "b", "c"], warns: true },
-            ]
-        }
-
-        function test_stringListModel(data) {
-            strings.strings = ["a", "b", "c"]
-            if (data.warns)
-                ignoreWarning(/out of range/)
-            data.edit()
-            view.forceLayout()
-            compare(strings.count, data.shown.length)
-            compare(view.count, data.shown.length)
-            var seen = []
-            for (var i = 0; i < view.count; ++i)
-                seen.push(view.itemAtIndex(i).text)
-            compare(seen, data.shown)
         }
     }
 }

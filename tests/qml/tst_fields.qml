@@ -3,20 +3,18 @@ import QtTest 1.2
 import Quorvane.Pelkan 1.0
 
 // Text fields with real keys and taps: typing, Enter running the EnterKey action,
-// remembered suggestions filtered while typing and taken by a tap, and the page keeping
-// the focused field above a keyboard.
+// remembered suggestions filtered while typing and taken by a tap, the page keeping the
+// focused field above a keyboard; and a formatting proxy model's roles in a list.
 Item {
     id: root
-    width: 480
-    height: 800
+    width: 480; height: 800
 
     property var entered: []
     property rect keyboard: Qt.rect(0, 500, 480, 300)
 
     Flickable {
         id: page
-        anchors.fill: parent
-        contentHeight: form.height
+        anchors.fill: parent; contentHeight: form.height
         VerticalAutoScroll.animated: false
         VerticalAutoScroll.keyboardRectangle: root.keyboard
 
@@ -46,9 +44,7 @@ Item {
         id: searchList
         ListView {
             id: list
-            width: 480
-            height: 400
-            model: root.cities
+            width: 480; height: 400; model: root.cities
             header: SearchField {
                 width: list.width
                 onTextChanged: list.model = root.cities.filter(function(city) { return city.toLowerCase().indexOf(text.toLowerCase()) >= 0 })
@@ -56,6 +52,10 @@ Item {
             delegate: Text { text: modelData; height: 40 }
         }
     }
+
+    ListModel { id: files }
+    FormattingProxyModel { id: proxy; formats: [{ role: "sizeText", source: "size", operation: "formatFileSize" }] }
+    ListView { id: fileList; y: 800; width: 400; height: 100; delegate: Text { height: 40; text: model.name + ": " + model.sizeText } }
 
     TestCase {
         name: "Fields"
@@ -65,6 +65,15 @@ Item {
             root.entered = []
             page.contentY = 0
             root.keyboard = Qt.rect(0, 500, 480, 300)
+        }
+
+        function tap(field) {
+            mouseClick(field, field.width / 2, field.topPadding + 4)
+        }
+
+        function type(text) {
+            for (var i = 0; i < text.length; ++i)
+                keyClick(text.charAt(i))
         }
 
         function test_typing_data() {
@@ -78,11 +87,9 @@ Item {
 
         function test_typing(data) {
             data.field.text = ""
-            mouseClick(data.field, data.field.width / 2, data.field.topPadding + 4)
-            verify(data.field.focused)
-            verify(data.field.empty)
-            for (var i = 0; i < data.typed.length; ++i)
-                keyClick(data.typed.charAt(i))
+            tap(data.field)
+            verify(data.field.focused && data.field.empty)
+            type(data.typed)
             compare(data.field.empty, false)
             keyClick(Qt.Key_Return)
             compare(data.field.text, data.text)
@@ -92,9 +99,8 @@ Item {
         // Typing past the field's end scrolls the text so the cursor stays in the field.
         function test_longText() {
             plain.text = ""
-            mouseClick(plain, plain.width / 2, plain.topPadding + 4)
-            for (var i = 0; i < 40; ++i)
-                keyClick("w")
+            tap(plain)
+            type("wwwwwwwwwwwwwwwwwwwwwwwwwwwwwwwwwwwwwwww")
             wait(500)
             tryVerify(function() {
                 var x = plain.editor.mapToItem(plain, plain.editor.cursorRectangle.x, 0).x
@@ -125,11 +131,10 @@ Item {
             search.remember("harbour")
             search.remember("hamburg")
             search.remember("oslo")
-            mouseClick(search, search.width / 2, search.topPadding + 4)
-            keyClick("h")
+            tap(search)
+            type("h")
             tryCompare(search, "suggestions", ["hamburg", "harbour"])
-            keyClick("a")
-            keyClick("r")
+            type("ar")
             tryCompare(search, "suggestions", ["harbour"])
             // The one suggestion left is the first row under the field's line.
             mouseClick(search, search.width / 2, search.labelItem.y + Theme.itemSizeSmall * 0.75 / 2)
@@ -149,14 +154,13 @@ Item {
             var made = data.component.createObject(root)
             var list = made.list || made
             var field = list.headerItem instanceof TextField ? list.headerItem : list.headerItem.children[1]
-            mouseClick(field, field.width / 2, field.topPadding + 4)
+            tap(field)
             verify(field.focused)
-            var typed = "os"
-            for (var i = 0; i < typed.length; ++i) {
-                keyClick(typed.charAt(i))
+            ;["o", "s"].forEach(function(key) {
+                type(key)
                 tryVerify(function() { return list.count > 0 && list.currentItem !== null })
-                verify(field.focused, "after " + typed.substring(0, i + 1))
-            }
+                verify(field.focused, "after " + field.text)
+            })
             compare(field.text, "os")
             made.destroy()
         }
@@ -173,13 +177,12 @@ Item {
 
         function test_searchesRemembered(data) {
             var first = data.first.createObject(root)
-            var field = first.field
-            mouseClick(field, field.width / 2, field.topPadding + 4)
-            keyClick("q"); keyClick("u"); keyClick("o"); keyClick("r"); keyClick("v"); keyClick("a"); keyClick("n"); keyClick("e")
+            tap(first.field)
+            type("quorvane")
             keyClick(Qt.Key_Return)
             var second = data.second.createObject(root) // over the first
-            mouseClick(second.field, field.width / 2, field.topPadding + 4)
-            keyClick("q")
+            tap(second.field)
+            type("q")
             if (data.offered.length > 0)
                 tryCompare(second.field, "suggestions", data.offered)
             wait(300) // past the typing delay: nothing else comes
@@ -207,6 +210,32 @@ Item {
             // The keyboard rises further: the field follows it.
             root.keyboard = Qt.rect(0, 300, 480, 500)
             tryVerify(function() { return field.editor.mapToItem(page, 0, field.editor.height).y <= 300.5 })
+        }
+
+        // The source's roles pass through next to the formatted ones, also over a ListModel
+        // that names its roles only once its first row arrives.
+        function test_formattingProxyRoles_data() {
+            return [
+                { tag: "source empty when attached, filled later", fillFirst: false },
+                { tag: "source filled when attached", fillFirst: true },
+            ]
+        }
+
+        function test_formattingProxyRoles(data) {
+            var fill = function() { files.append({ "name": "a.jpg", "size": 2048 }); files.append({ "name": "b.txt", "size": 10 }) }
+            fileList.model = null
+            proxy.sourceModel = null
+            files.clear()
+            if (data.fillFirst)
+                fill()
+            proxy.sourceModel = files
+            fileList.model = proxy
+            if (!data.fillFirst)
+                fill()
+            tryCompare(fileList, "count", 2)
+            fileList.forceLayout()
+            compare(fileList.itemAtIndex(0).text, "a.jpg: " + Format.formatFileSize(2048, 1))
+            compare(fileList.itemAtIndex(1).text, "b.txt: " + Format.formatFileSize(10, 1))
         }
     }
 }

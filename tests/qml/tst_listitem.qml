@@ -8,16 +8,13 @@ import Quorvane.Pelkan 1.0
 // text, description and icon.
 Item {
     id: root
-    width: 800
-    height: 800
+    width: 800; height: 800
 
     property var log: []
 
     ListView {
         id: view
-        width: 400
-        height: parent.height
-        model: 5
+        width: 400; height: parent.height; model: 5
         delegate: ListItem {
             id: row
             objectName: "row" + index

@@ -1,15 +1,12 @@
 import QtQuick 2.6
-import QtQuick.Window 2.2
 import QtTest 1.2
 import Quorvane.Pelkan 1.0
-import PelkanTest 1.0
 
 // The page stack through its public surface: moves made by calls and by swipes (real mouse
 // and touch events), alone and in quick succession, the statuses they leave, and dialogs.
 Item {
     id: root
-    width: 400
-    height: 600
+    width: 400; height: 600
 
     property var log: []
     property var faults: []
@@ -53,9 +50,8 @@ Item {
         }
     }
 
-    TestCase {
+    GestureTestCase {
         name: "PageStack"
-        when: windowShown
 
         readonly property Item stack: app.pageStack
 
@@ -83,36 +79,18 @@ Item {
             tryCompare(stack, "busy", false)
         }
 
-        // A finger (or the mouse) from one x to another at mid-height in a dozen moves, the
-        // pages following it; "cancel" ends in the system taking the touch away.
+        // Across the middle in a dozen moves on the stack's clock (16 ms apart: a finger at 60
+        // frames a second), the pages following.
         function drag(input, fromX, toX, msPerMove) {
-            var y = 300
-            var steps = 12
-            var touch = input !== "mouse" ? touchEvent(stack) : null
-            if (touch)
-                touch.press(0, stack, fromX, y).commit()
-            else
-                mousePress(stack, fromX, y)
-            for (var i = 1; i <= steps; ++i) {
-                root.now += msPerMove || 16 // a finger's pace at 60 frames a second
-                var x = fromX + (toX - fromX) * i / steps
-                if (touch)
-                    touch.move(0, stack, x, y).commit()
-                else
-                    mouseMove(stack, x, y)
-            }
-            var moved = stack._leftFlickDifference - stack._rightFlickDifference
-            verify(moved !== 0)
-            compare(stack.currentPage.x, moved)
-            var beside = moved > 0 ? stack.previousPage : stack.nextPage
-            if (beside)
-                compare(beside.x, moved > 0 ? moved - stack.width : moved + stack.width)
-            if (input === "cancel")
-                TouchSystem.cancel(root.Window.window)
-            else if (touch)
-                touch.release(0, stack, toX, y).commit()
-            else
-                mouseRelease(stack, toX, y)
+            swipe(stack, input, fromX, 300, toX, 300, { steps: 12, moving: function() { root.now += msPerMove || 16 },
+                released: function() {
+                    var moved = stack._leftFlickDifference - stack._rightFlickDifference
+                    verify(moved !== 0)
+                    compare(stack.currentPage.x, moved)
+                    var beside = moved > 0 ? stack.previousPage : stack.nextPage
+                    if (beside)
+                        compare(beside.x, moved > 0 ? moved - stack.width : moved + stack.width)
+                } })
         }
 
         function test_move_data() {
@@ -198,8 +176,6 @@ Item {
             return [
                 { tag: "accept button", act: function(d, t) { t.mouseClick(d.header, d.width - 20, 20) }, outcome: accepted },
                 { tag: "cancel button", act: function(d, t) { t.mouseClick(d.header, 20, 20) }, outcome: rejected },
-                { tag: "accept()", act: function(d) { d.accept() }, outcome: accepted },
-                { tag: "reject()", act: function(d) { d.reject() }, outcome: rejected },
                 { tag: "swipe forward", act: function(d, t) { t.drag("touch", 380, 60) }, outcome: accepted },
                 { tag: "swipe back", act: function(d, t) { t.drag("mouse", 20, 340) }, outcome: rejected },
                 { tag: "accept() while it cannot", cannot: true, act: function(d) { d.accept() }, outcome: ["opened"] },

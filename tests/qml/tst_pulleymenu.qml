@@ -1,18 +1,15 @@
 import QtQuick 2.6
-import QtQuick.Window 2.2
 import QtTest 1.2
 import Quorvane.Pelkan 1.0
-import PelkanTest 1.0
 
-// Pull-down and push-up menus declared inside a Flickable, a ListView and a GridView, with
-// real drags from the edge: how far the menu is out picks the item, letting go runs it once
-// the content rests at its edge; pulled clearly past the whole menu, or with the touch
-// cancelled, nothing runs. The window is as tall, against the pull-down menu, as a
-// 960 px window against a label and four items at pixel ratio 2.
+// Pull-down and push-up menus declared inside a Flickable, a ListView and a GridView, and on
+// the gallery's list page, with real drags from the edge: how far the menu is out picks the
+// item, letting go runs it once the content rests at its edge; pulled clearly past the whole
+// menu, or with the touch cancelled, nothing runs. The window is as tall, against the
+// pull-down menu, as a 960 px window against a label and four items at pixel ratio 2.
 Item {
     id: root
-    width: 600
-    height: Math.round((Theme.itemSizeSmall * 0.6 + 4 * Theme.itemSizeSmall * 0.75 + 2 * Theme.paddingLarge) / 0.7)
+    width: 600; height: Math.round((Theme.itemSizeSmall * 0.6 + 4 * Theme.itemSizeSmall * 0.75 + 2 * Theme.paddingLarge) / 0.7)
 
     property var log: []
     property int rows: 40
@@ -54,22 +51,16 @@ Item {
                     anchors.fill: parent
                     Flickable {
                         id: flickable
-                        width: parent.width / 3
-                        height: parent.height
-                        contentHeight: root.rows * 50
-                        property Item pullDownMenu
-                        property Item pushUpMenu
+                        width: parent.width / 3; height: parent.height; contentHeight: root.rows * 50
+                        property Item pullDownMenu; property Item pushUpMenu
                         Component.onCompleted: [downMenu, upMenu].forEach(function(menu) { menu.createObject(contentItem) })
                     }
                     ListView {
                         id: list
-                        width: parent.width / 3
-                        height: parent.height
-                        model: root.rows
+                        width: parent.width / 3; height: parent.height; model: root.rows
                         header: Rectangle { width: list.width; height: 100; color: Theme.highlightBackgroundColor }
                         delegate: Item { width: list.width; height: 50 }
-                        property Item pullDownMenu
-                        property Item pushUpMenu
+                        property Item pullDownMenu; property Item pushUpMenu
                         Component.onCompleted: [downMenu, upMenu].forEach(function(menu) { menu.createObject(list) })
                         ViewPlaceholder {
                             id: placeholder
@@ -79,14 +70,9 @@ Item {
                     }
                     GridView {
                         id: grid
-                        width: parent.width / 3
-                        height: parent.height
-                        model: root.rows
-                        cellWidth: width
-                        cellHeight: 50
+                        width: parent.width / 3; height: parent.height; model: root.rows; cellWidth: width; cellHeight: 50
                         delegate: Item { width: 50; height: 50 }
-                        property Item pullDownMenu
-                        property Item pushUpMenu
+                        property Item pullDownMenu; property Item pushUpMenu
                         Component.onCompleted: [downMenu, upMenu].forEach(function(menu) { menu.createObject(grid) })
                     }
                 }
@@ -94,9 +80,8 @@ Item {
         }
     }
 
-    TestCase {
+    GestureTestCase {
         name: "PulleyMenu"
-        when: windowShown
 
         function init() {
             root.log = []
@@ -112,40 +97,18 @@ Item {
             return (menu === menu.flickable.pullDownMenu ? menu.height - middle : middle) + 4
         }
 
-        // One drag from the view's edge (from where the finger can go furthest) in small
-        // steps, as a finger moves, until the menu is out that far or the finger reaches the
-        // window's other edge; then the finger lifts, or the system takes the touch away.
+        // One drag from the view's edge (from where the finger can go furthest) in 6 px
+        // steps, until the menu is out that far (a number, or a function of the menu) or the
+        // finger reaches the other edge.
         function pull(view, down, distance, input) {
             var menu = down ? view.pullDownMenu : view.pushUpMenu
-            var x = view.width / 2
-            var y = down ? 1 : view.height - 1
-            var step = down ? 6 : -6
-            var touch = input === "mouse" ? null : touchEvent(view)
-            if (touch)
-                touch.press(0, view, x, y).commit()
-            else
-                mousePress(view, x, y)
-            for (var moves = 1; menu.dragDistance < distance && y + step > 0 && y + step < view.height; ++moves) {
-                y += step
-                if (touch)
-                    touch.move(0, view, x, y).commit()
-                else
-                    mouseMove(view, x, y)
-                if (input === "two fingers" && moves === 5)
-                    touch.stationary(0).press(1, view, x / 2, view.height / 2).commit()
-                wait(5)
-            }
-            verify(menu.active)
-            verify(menu.dragDistance >= distance, "out by " + menu.dragDistance + " of " + distance)
-            if (input === "cancelled")
-                TouchSystem.cancel(root.Window.window)
-            else if (input === "two fingers")
-                touch.release(0, view, x, y).stationary(1).commit().release(1, view, x / 2, view.height / 2).commit()
-            else if (touch)
-                touch.release(0, view, x, y).commit()
-            else
-                mouseRelease(view, x, y)
-            return menu
+            var far = typeof distance === "function" ? distance : function() { return distance }
+            var steps = Math.floor((view.height - 2) / 6)
+            swipe(view, input, view.width / 2, down ? 1 : view.height - 1, view.width / 2, down ? 1 + 6 * steps : view.height - 1 - 6 * steps,
+                  { steps: steps, pace: 5, moving: function() { return menu.dragDistance >= far() }, released: function() {
+                      verify(menu.active)
+                      verify(menu.dragDistance >= far(), "out by " + menu.dragDistance + " of " + far())
+                  } })
         }
 
         function test_pick_data() {
@@ -168,7 +131,7 @@ Item {
                 { tag: "short content, down, touch", view: 1, down: true, nth: 2, rows: 2, input: "touch", picked: "Second" },
                 { tag: "short content, up", view: 0, down: false, rows: 2, picked: "Up" },
                 { tag: "short content, up, two fingers", view: 2, down: false, rows: 2, input: "two fingers", picked: "Up" },
-                { tag: "touch cancelled: nothing", view: 1, down: true, nth: 3, input: "cancelled", picked: undefined },
+                { tag: "touch cancelled: nothing", view: 1, down: true, nth: 3, input: "cancel", picked: undefined },
             ])
         }
 
@@ -238,13 +201,47 @@ Item {
             compare(placeholder.mapToItem(view, 0, placeholder.height).y, view.height)
             var before = gap()
             var headerAt = header.mapToItem(view, 0, 0).y
-            mousePress(view, view.width / 2, 1)
-            for (var y = 7; y < view.height / 2; y += 6)
-                mouseMove(view, view.width / 2, y)
-            verify(header.mapToItem(view, 0, 0).y > headerAt + Theme.itemSizeSmall)
-            compare(gap(), before)
-            mouseRelease(view, view.width / 2, y)
+            swipe(view, "mouse", view.width / 2, 1, view.width / 2, view.height / 2, { steps: 20, released: function() {
+                verify(header.mapToItem(view, 0, 0).y > headerAt + Theme.itemSizeSmall)
+                compare(gap(), before)
+            } })
             tryCompare(view, "moving", false)
+        }
+
+        // The gallery's "Lists and menus" page as a user meets it: pulled down from the top,
+        // its menu opens entirely and its far item, "Clear", counts down over the page once
+        // the list is back; a tap cancels it.
+        function test_galleryListsPage() {
+            var page = app.pageStack.push(Qt.resolvedUrl("../../examples/gallery/qml/ListsPage.qml"), {}, PageStackAction.Immediate)
+            var view = findItem(page, ListView)
+            var popup = findItem(page, RemorsePopup)
+            var menu = view.pullDownMenu
+            var rows = view.count
+            verify(menu && popup && rows > 0)
+            view.contentY = view.originY - view.topMargin
+            pull(view, true, function() { return menu.height }, "mouse") // the menu grows as it comes out
+            tryCompare(popup, "active", true)
+            compare(view.contentY, view.originY)
+            mouseClick(popup, popup.width / 2, popup.height / 2)
+            verify(!popup.active)
+            wait(100)
+            compare(view.count, rows)
+        }
+
+        function cleanup() {
+            while (app.pageStack.depth > 1)
+                app.pageStack.pop(PageStackAction.Immediate)
+        }
+
+        function findItem(item, type) {
+            if (item instanceof type)
+                return item
+            for (var i = 0; i < item.children.length; ++i) {
+                var found = findItem(item.children[i], type)
+                if (found)
+                    return found
+            }
+            return null
         }
     }
 }

@@ -1,26 +1,21 @@
 import QtQuick 2.6
-import QtQuick.Window 2.2
 import QtTest 1.2
 import Quorvane.Pelkan 1.0
 import Quorvane.Pelkan.private 1.0 as Private
-import PelkanTest 1.0
 
 // Sliding views with real drags: where a release settles, the joined ends, the items the
-// cache keeps alive (counted), the attached values during a slide, tabs, and which of
-// the view and the page stack takes a swipe.
+// cache keeps alive (counted), the attached values during a slide, tabs, which of the view
+// and the page stack takes a swipe, the sources and model edits a view follows.
 Item {
     id: root
-    width: 400
-    height: 800
+    width: 400; height: 800
 
     property int made: 0
     property int gone: 0
 
     Private.SlideableBase {
         id: view
-        width: 400
-        height: 300
-        model: 100
+        width: 400; height: 300; model: 100
         delegate: Rectangle {
             // What the view attaches, read back by the test.
             readonly property var slide: ({ index: Private.Slide.index, exposed: Private.Slide.exposed,
@@ -36,18 +31,13 @@ Item {
 
     TabView {
         id: tabs
-        y: 320
-        height: 200
+        y: 320; height: 200
         model: ["One", "Two", "Three"]
         delegate: Item {}
     }
 
-    // The same three items from each kind of source.
     Private.StringListModel { id: strings; strings: ["a", "b", "c"] }
-    Component { id: textDelegate; Text { text: modelData } }
-    Private.SlideableBase { id: fromNumber; y: 800; width: 100; height: 50; model: 3; delegate: textDelegate }
-    Private.SlideableBase { id: fromList; y: 800; width: 100; height: 50; model: ["a", "b", "c"]; delegate: textDelegate }
-    Private.SlideableBase { id: fromModel; y: 800; width: 100; height: 50; model: strings; delegate: textDelegate }
+    ListView { id: list; y: 800; width: 100; height: 80; model: strings; delegate: Text { height: 20; text: display } }
     Private.SlideableBase {
         id: fromChildren; y: 800; width: 100; height: 50
         Text { text: "a" }
@@ -57,9 +47,7 @@ Item {
 
     ApplicationWindow {
         id: app
-        y: 540
-        width: 400
-        height: 260
+        y: 540; width: 400; height: 260
     }
 
     Component {
@@ -68,32 +56,24 @@ Item {
             property alias view: inner
             Private.SlideableBase {
                 id: inner
-                anchors.fill: parent
-                model: 3
+                anchors.fill: parent; model: 3
                 delegate: Item {}
             }
         }
     }
 
-    TestCase {
+    GestureTestCase {
         name: "Slideable"
-        when: windowShown
-
-        function drag(target, fromX, toX, y, steps, pace, beforeRelease) {
-            mousePress(target, fromX, y)
-            for (var i = 1; i <= steps; ++i)
-                mouseMove(target, fromX + (toX - fromX) * i / steps, y, pace)
-            if (beforeRelease)
-                beforeRelease()
-            mouseRelease(target, toX, y, Qt.LeftButton, Qt.NoModifier, pace)
-        }
 
         function init() {
+            strings.strings = ["a", "b", "c"]
             view.loops = false
             view.cacheSize = 2
             view.moveTo(5, TabViewAction.Immediate)
         }
 
+        // Where a release settles; a second finger joining and leaving does not disturb the
+        // first, a touch the system takes away settles on the nearer item.
         function test_settle_data() {
             return [
                 { tag: "slow, past half: next", from: 350, to: 100, pace: 40, index: 6 },
@@ -102,6 +82,8 @@ Item {
                 { tag: "quick flick back", from: 50, to: 120, pace: 5, index: 4 },
                 { tag: "loops: before the first is the last", start: 0, loops: true, from: 50, to: 300, pace: 40, index: 99 },
                 { tag: "no loop: the first stays", start: 0, from: 50, to: 300, pace: 40, index: 0 },
+                { tag: "touch, cancelled by the system past half", input: "cancel", from: 350, to: 50, index: 6 },
+                { tag: "touch, a second finger comes and goes", input: "second finger", from: 350, to: 50, index: 6 },
             ]
         }
 
@@ -109,8 +91,10 @@ Item {
             view.loops = !!data.loops
             if (data.start !== undefined)
                 view.moveTo(data.start, TabViewAction.Immediate)
-            drag(view, data.from, data.to, 150, 10, data.pace)
+            swipe(view, data.input || "mouse", data.from, 150, data.to, 150, { pace: data.pace,
+                  released: function() { verify(view.dragging || !data.input) } })
             tryCompare(view, "moving", false)
+            compare(view.dragging, false)
             compare(view.currentIndex, data.index)
             compare(view.position, data.index)
             compare(view.currentItem.x, 0)
@@ -129,7 +113,7 @@ Item {
             view.cacheSize = data.cache
             view.moveTo(50, TabViewAction.Immediate)
             compare(view.aliveCount, data.alive)
-            drag(view, 350, 100, 150, 10, 40)
+            swipe(view, "mouse", 350, 150, 100, 150, { pace: 40 })
             tryCompare(view, "moving", false)
             compare(view.currentIndex, 51)
             compare(view.aliveCount, data.alive)
@@ -140,8 +124,7 @@ Item {
 
         function test_attachedDuringSlide() {
             var current = view.currentItem
-            drag(view, 350, 250, 150, 5, 40, function() {
-                verify(view.dragging)
+            swipe(view, "mouse", 350, 150, 250, 150, { steps: 5, pace: 40, released: function() {
                 var next = current.slide.forward
                 verify(next !== null)
                 compare(next.slide.index, 6)
@@ -151,20 +134,22 @@ Item {
                 fuzzyCompare(next.slide.offset, current.slide.offset + 1, 1e-9)
                 compare(next.slide.view, view)
                 compare(next.slide.backward, current)
-            })
+            } })
             tryCompare(view, "moving", false)
         }
 
         function test_tabs_data() {
             return [
                 { tag: "tap the third title", act: function() { mouseClick(tabs, 400 * 5 / 6, 20) }, index: 2 },
-                { tag: "swipe to the second", act: function() { drag(tabs, 350, 100, tabs.view.y + tabs.view.height / 2, 10, 40) }, index: 1 },
+                { tag: "swipe to the second", act: function(t) {
+                    var y = tabs.view.y + tabs.view.height / 2
+                    t.swipe(tabs, "mouse", 350, y, 100, y, { pace: 40 }) }, index: 1 },
             ]
         }
 
         function test_tabs(data) {
             tabs.moveTo(0, TabViewAction.Immediate)
-            data.act()
+            data.act(this)
             tryCompare(tabs, "moving", false)
             compare(tabs.currentIndex, data.index)
             compare(tabs.view.aliveCount, 1) // lazily made, one at a time
@@ -173,8 +158,8 @@ Item {
         // At the view's first item the back swipe is the page stack's; further in, the view's.
         function test_backSwipe_data() {
             return [
-                { tag: "first item: the page goes", index: 0, depth: 1, viewIndex: 0 },
-                { tag: "second item: the view slides", index: 1, depth: 2, viewIndex: 0 },
+                { tag: "first item: the page goes", index: 0, depth: 1 },
+                { tag: "second item: the view slides", index: 1, depth: 2 },
             ]
         }
 
@@ -182,112 +167,93 @@ Item {
             var stack = app.pageStack
             stack.clear()
             stack.push(pageWithView, {}, PageStackAction.Immediate)
-            var page = stack.push(pageWithView, {}, PageStackAction.Immediate)
-            page.view.moveTo(data.index, TabViewAction.Immediate)
-            var inner = page.view
-            drag(stack, 20, 300, 130, 12, 16)
+            var inner = stack.push(pageWithView, {}, PageStackAction.Immediate).view
+            inner.moveTo(data.index, TabViewAction.Immediate)
+            swipe(stack, "mouse", 20, 130, 300, 130, { steps: 12, pace: 16 })
             tryCompare(stack, "busy", false)
             compare(stack.depth, data.depth)
             if (data.depth === 2) {
                 tryCompare(inner, "moving", false)
-                compare(inner.currentIndex, data.viewIndex)
+                compare(inner.currentIndex, 0)
             }
         }
 
+        // The index asked for holds however the declaration orders it against the model, and
+        // items lie side by side whatever the source.
         function test_sources_data() {
-            return [
-                { tag: "number", view: fromNumber, second: "1" },
-                { tag: "list", view: fromList, second: "b" },
-                { tag: "item model", view: fromModel, second: "b" },
-                { tag: "children", view: fromChildren, second: "b" },
+            var rows = []
+            var orders = [
+                { name: "model first", text: "model: 5; currentIndex: 2\ndelegate: Text { text: modelData }", current: "2" },
+                { name: "index first", text: "currentIndex: 2; model: 5\ndelegate: Text { text: modelData }", current: "2" },
+                { name: "delegate first", text: "delegate: Text { text: modelData }\nmodel: 5; currentIndex: 2", current: "2" },
+                { name: "list, index first", text: "currentIndex: 2; model: ['a', 'b', 'c', 'd', 'e']\ndelegate: Text { text: modelData }",
+                  current: "c" },
+                { name: "list, model first", text: "model: ['a', 'b', 'c', 'd', 'e']; currentIndex: 2\ndelegate: Text { text: modelData }",
+                  current: "c" },
+                { name: "item model", text: "model: strings; currentIndex: 2; delegate: Text { text: modelData }", current: "c" },
             ]
+            ;["Private.SlideableBase", "SlideshowView", "TabView"].forEach(function(type) {
+                orders.forEach(function(order) {
+                    rows.push({ tag: type + ", " + order.name, type: type, properties: order.text, current: order.current })
+                })
+            })
+            return rows.concat({ tag: "children", view: fromChildren, current: "c" })
         }
 
         function test_sources(data) {
-            compare(data.view.count, 3)
-            data.view.moveTo(1, TabViewAction.Immediate)
-            compare(data.view.currentItem.text, data.second)
-            compare(data.view.currentItem.x, 0)
-            compare(data.view.itemAt(2).x, data.view.width)
-            data.view.moveTo(0, TabViewAction.Immediate)
-        }
-
-        // The index asked for holds however the declaration orders it against the model.
-        function test_declarationOrder_data() {
-            var rows = []
-            var types = ["Private.SlideableBase", "SlideshowView", "TabView"]
-            var orders = [
-                { name: "model first", text: "model: 5; currentIndex: 2\ndelegate: Item {}" },
-                { name: "index first", text: "currentIndex: 2; model: 5\ndelegate: Item {}" },
-                { name: "delegate first", text: "delegate: Item {}\nmodel: 5; currentIndex: 2" },
-                { name: "list, index first", text: "currentIndex: 2; model: ['a', 'b', 'c', 'd', 'e']\ndelegate: Item {}" },
-                { name: "list, model first", text: "model: ['a', 'b', 'c', 'd', 'e']; currentIndex: 2\ndelegate: Item {}" },
-            ]
-            for (var t = 0; t < types.length; ++t) {
-                for (var o = 0; o < orders.length; ++o)
-                    rows.push({ tag: types[t] + ", " + orders[o].name, type: types[t], properties: orders[o].text })
+            var made = data.view || Qt.createQmlObject("import QtQuick 2.6; import Quorvane.Pelkan 1.0; "
+                                                       + "import Quorvane.Pelkan.private 1.0 as Private; "
+                                                       + data.type + " { width: 100; height: 100; " + data.properties + " }", root)
+            made.moveTo(data.view ? 2 : made.currentIndex, TabViewAction.Immediate)
+            compare(made.currentIndex, 2)
+            compare(made.currentItem.Private.Slide.index, 2)
+            if (data.type !== "TabView") {
+                compare(made.currentItem.text, data.current)
+                compare(made.currentItem.x, 0)
+                compare(made.itemAt(1).x, -made.width)
             }
-            return rows
+            if (!data.view)
+                made.destroy()
         }
 
-        function test_declarationOrder(data) {
-            var view = Qt.createQmlObject("import QtQuick 2.6; import Quorvane.Pelkan 1.0; "
-                                          + "import Quorvane.Pelkan.private 1.0 as Private; "
-                                          + data.type + " { width: 100; height: 100; " + data.properties + " }", root)
-            compare(view.currentIndex, 2)
-            verify(view.currentItem !== null)
-            compare(view.currentItem.Private.Slide.index, 2)
-            view.destroy()
-        }
-
-        // Rows that come and go make the items again for the rows now there; a row that
-        // changes updates its item.
-        function test_modelEdits() {
-            fromModel.moveTo(2, TabViewAction.Immediate)
-            strings.remove(2)
-            compare(fromModel.count, 2)
-            compare(fromModel.currentIndex, 1)
-            compare(fromModel.currentItem.text, "b")
-            strings.insert(0, "z")
-            compare(fromModel.itemAt(0).text, "z")
-            // A changed row reaches the item made for it, which stays.
-            var item = fromModel.itemAt(0)
-            strings.set(0, "y")
-            compare(fromModel.itemAt(0), item)
-            compare(item.text, "y")
-            strings.strings = ["a", "b", "c"]
-        }
-
-        // Touch: a second finger joining and leaving does not disturb the first; a touch the
-        // system takes away settles on the nearer item.
-        function test_touch_data() {
+        // Model edits as a list view shows them: the items are made again for the rows now
+        // there, the current one follows its row, a changed row updates the item made for it.
+        function test_modelEdits_data() {
             return [
-                { tag: "cancelled by the system", cancel: true, index: 6 },
-                { tag: "a second finger comes and goes", secondFinger: true, index: 6 },
+                { tag: "append", edit: function() { strings.append("d") }, shown: ["a", "b", "c", "d"] },
+                { tag: "insert", edit: function() { strings.insert(1, "x") }, shown: ["a", "x", "b", "c"] },
+                { tag: "remove two", edit: function() { strings.remove(0, 2) }, shown: ["c"] },
+                { tag: "move down", edit: function() { strings.move(0, 2) }, shown: ["b", "c", "a"] },
+                { tag: "move up", edit: function() { strings.move(2, 0) }, shown: ["c", "a", "b"] },
+                { tag: "set: the item stays", edit: function() { strings.set(2, "y") }, shown: ["a", "b", "y"], kept: true },
+                { tag: "out of range: nothing", edit: function() { strings.remove(5) }, shown: ["a", "b", "c"], warns: true, kept: true },
+                { tag: "the current row removed", edit: function() { strings.remove(2) }, shown: ["a", "b"], current: 1 },
             ]
         }
 
-        function test_touch(data) {
-            var touch = touchEvent(view)
-            touch.press(0, view, 350, 150).commit()
-            for (var i = 1; i <= 10; ++i) {
-                if (data.secondFinger && i === 4)
-                    touch.stationary(0).press(1, view, 100, 200).commit()
-                else if (data.secondFinger && i > 4 && i < 8)
-                    touch.move(0, view, 350 - 30 * i, 150).move(1, view, 100, 200 + i).commit()
-                else if (data.secondFinger && i === 8)
-                    touch.move(0, view, 350 - 30 * i, 150).release(1, view, 100, 210).commit()
-                else
-                    touch.move(0, view, 350 - 30 * i, 150).commit()
+        function test_modelEdits(data) {
+            var made = Qt.createQmlObject("import Quorvane.Pelkan.private 1.0; import QtQuick 2.6; SlideableBase { "
+                                          + "width: 100; height: 50; model: strings; currentIndex: 2; delegate: Text { text: modelData } }", root)
+            var item = made.currentItem
+            if (data.warns)
+                ignoreWarning(/out of range/)
+            data.edit()
+            list.forceLayout()
+            compare(strings.count, data.shown.length)
+            compare(made.count, data.shown.length)
+            if (data.current !== undefined)
+                compare(made.currentIndex, data.current)
+            if (data.kept)
+                compare(made.currentItem, item)
+            var listed = [], slid = []
+            for (var i = 0; i < data.shown.length; ++i) {
+                listed.push(list.itemAtIndex(i).text)
+                made.moveTo(i, TabViewAction.Immediate)
+                slid.push(made.currentItem.text)
             }
-            verify(view.dragging)
-            if (data.cancel)
-                TouchSystem.cancel(root.Window.window)
-            else
-                touch.release(0, view, 50, 150).commit()
-            tryCompare(view, "moving", false)
-            compare(view.dragging, false)
-            compare(view.currentIndex, data.index) // moved 300 of 400: the nearer item
+            compare(listed, data.shown)
+            compare(slid, data.shown)
+            made.destroy()
         }
     }
 }

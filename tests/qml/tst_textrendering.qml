@@ -7,22 +7,19 @@ import Quorvane.Pelkan 1.0
 // focus and error. Run in both render loops.
 Rectangle {
     id: root
-    width: 400
-    height: 800 // no smaller than the files run after it: the test window keeps its size
+    width: 400; height: 800 // no smaller than the files run after it: the test window keeps its size
     color: "black"
 
     Label {
         id: label
-        width: 300
-        color: "white"
+        width: 300; color: "white"
         font.pixelSize: 32
         truncationMode: TruncationMode.Fade
     }
 
     TextField {
         id: field
-        y: 100
-        width: 400
+        y: 100; width: 400
         underline.color: "#0000ff"
         underline.highlightColor: "#00ff00"
         underline.errorColor: "#ff0000"

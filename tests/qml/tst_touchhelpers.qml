@@ -6,8 +6,7 @@ import Quorvane.Pelkan.private 1.0 as Private
 // TouchBlocker, InverseMouseArea and DragFilter with real presses.
 Item {
     id: root
-    width: 400
-    height: 600
+    width: 400; height: 600
 
     MouseArea {
         id: below
@@ -55,28 +54,15 @@ Item {
             MouseArea {
                 id: slider
                 property int moves: 0
-                y: 200
-                width: parent.width
-                height: 100
+                y: 200; width: parent.width; height: 100
                 Private.DragFilter.orientations: Qt.Horizontal
                 onPositionChanged: moves++
             }
         }
     }
 
-    TestCase {
+    GestureTestCase {
         name: "TouchHelpers"
-        when: windowShown
-
-        function tap(input, item, x, y) {
-            if (input === "touch") {
-                var touch = touchEvent(item)
-                touch.press(0, item, x, y).commit()
-                touch.release(0, item, x, y).commit()
-            } else {
-                mouseClick(item, x, y)
-            }
-        }
 
         function test_blocker_data() {
             return [
@@ -90,7 +76,7 @@ Item {
         function test_blocker(data) {
             below.clicks = 0
             blocker.enabled = data.enabled
-            tap(data.input, root, 100, 100)
+            swipe(root, data.input, 100, 100, 100, 100, { steps: 1 })
             mouseWheel(root, 100, 100, 0, -120)
             compare(below.clicks, data.clicks)
         }
@@ -102,6 +88,7 @@ Item {
                 { tag: "inside", input: "mouse", x: 300, y: 300, seen: [], clicks: 0 },
                 { tag: "on an item that counts as inside", input: "touch", x: 350, y: 550, seen: [], clicks: 0 },
                 { tag: "disabled", input: "mouse", x: 50, y: 450, disabled: true, seen: [], clicks: 1 },
+                { tag: "dragged outside: no click", input: "mouse", x: 50, y: 450, toX: 150, seen: ["pressed -150,250"], clicks: 0 },
             ]
         }
 
@@ -109,19 +96,11 @@ Item {
             button.clicks = 0
             outside.seen = []
             outside.enabled = !data.disabled
-            tap(data.input, root, data.x, data.y)
+            swipe(root, data.input, data.x, data.y, data.toX || data.x, data.y, { steps: 1 })
             compare(outside.seen, data.seen)
             compare(button.clicks, data.clicks, "the press is not taken")
             verify(!outside.pressed)
             outside.enabled = true
-        }
-
-        function test_dragOutsideIsNoClick() {
-            outside.seen = []
-            mousePress(root, 50, 450)
-            mouseMove(root, 150, 450)
-            mouseRelease(root, 150, 450)
-            compare(outside.seen, ["pressed -150,250"])
         }
 
         function test_dragFilter_data() {
@@ -139,10 +118,7 @@ Item {
             stack.push(sliderPage, {}, PageStackAction.Immediate)
             var page = stack.push(sliderPage, {}, PageStackAction.Immediate)
             page.slider.Private.DragFilter.orientations = data.orientations
-            mousePress(stack, 20, 250)
-            for (var x = 40; x <= 340; x += 20)
-                mouseMove(stack, x, 250)
-            mouseRelease(stack, 340, 250)
+            swipe(stack, "mouse", 20, 250, 340, 250, { steps: 16 })
             tryCompare(stack, "busy", false)
             compare(stack.depth, data.depth)
             app.visible = false
