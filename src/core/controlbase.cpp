@@ -1,5 +1,6 @@
 #include "controlbase.h"
 
+#include <QFocusEvent>
 #include <QGuiApplication>
 #include <QStyleHints>
 #include <QtQml/qqml.h>
@@ -171,6 +172,26 @@ void ControlBase::mouseReleaseEvent(QMouseEvent *event)
 {
     focusOnRelease();
     Control::mouseReleaseEvent(event);
+}
+
+void ControlBase::focusInEvent(QFocusEvent *event)
+{
+    Control::focusInEvent(event);
+    const Qt::FocusReason reason = event->reason();
+    const bool visual = reason == Qt::TabFocusReason || reason == Qt::BacktabFocusReason || reason == Qt::ShortcutFocusReason;
+    if (m_visualFocus != visual) {
+        m_visualFocus = visual;
+        Q_EMIT visualFocusChanged();
+    }
+}
+
+void ControlBase::focusOutEvent(QFocusEvent *event)
+{
+    Control::focusOutEvent(event);
+    if (m_visualFocus) {
+        m_visualFocus = false;
+        Q_EMIT visualFocusChanged();
+    }
 }
 
 } // namespace Pelkan

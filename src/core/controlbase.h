@@ -13,7 +13,8 @@ namespace Pelkan {
 // control's QML file only draws it. A control
 // - is a focus scope: focus given to it goes to the part of it the control (or the
 //   application) focused last, so a page keeps the field an application focused in it;
-// - takes focus by Tab and Shift+Tab and, where its `focusPolicy` says so, by a press;
+// - takes focus by Tab and Shift+Tab and, where its `focusPolicy` says so, by a press, and
+//   says when the focus came from the keyboard (`visualFocus`), for its look to show it;
 // - says whether it is laid out right to left (`mirrored`, from the LayoutMirroring it
 //   inherits), for its look to follow;
 // - tells assistive technology its role, its name (`text` unless Accessible.name is set),
@@ -32,6 +33,9 @@ class ControlBase : public Control, public QAccessible::ActivationObserver
     // How the control takes focus: Qt.TabFocus (Tab and Shift+Tab), Qt.ClickFocus (a press),
     // Qt.StrongFocus (both) or Qt.NoFocus.
     Q_PROPERTY(Qt::FocusPolicy focusPolicy READ focusPolicy WRITE setFocusPolicy NOTIFY focusPolicyChanged)
+    // Whether the control has the active focus by Tab, Shift+Tab or a shortcut: the look shows
+    // a keyboard user where they are (a press that focuses shows nothing).
+    Q_PROPERTY(bool visualFocus READ hasVisualFocus NOTIFY visualFocusChanged)
     // Whether the control is laid out right to left: the look mirrors itself while true.
     Q_PROPERTY(bool mirrored READ isMirrored NOTIFY mirroredChanged)
     // What the control is to assistive technology (an Accessible role, e.g. Accessible.Button).
@@ -49,6 +53,7 @@ public:
     Qt::FocusPolicy focusPolicy() const { return m_focusPolicy; }
     void setFocusPolicy(Qt::FocusPolicy policy);
 
+    bool hasVisualFocus() const { return m_visualFocus; }
     bool isMirrored() const;
 
     int accessibleRole() const;
@@ -60,6 +65,7 @@ Q_SIGNALS:
     void textChanged();
     void descriptionChanged();
     void focusPolicyChanged();
+    void visualFocusChanged();
     void mirroredChanged();
     void accessibleRoleChanged();
 
@@ -67,6 +73,8 @@ protected:
     void componentComplete() override;
     void mousePressEvent(QMouseEvent *event) override;
     void mouseReleaseEvent(QMouseEvent *event) override;
+    void focusInEvent(QFocusEvent *event) override;
+    void focusOutEvent(QFocusEvent *event) override;
 
     // A press gives focus where the focus policy says so (on release where the platform
     // focuses on touch release).
@@ -95,6 +103,7 @@ private:
     int m_accessibleRole = -1;
     QQuickAccessibleAttached *m_accessible = nullptr;
     mutable bool m_mirrorNotifier = false;
+    bool m_visualFocus = false;
 };
 
 } // namespace Pelkan

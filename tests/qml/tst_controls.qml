@@ -38,6 +38,14 @@ Item {
         }
     }
 
+    // A closed pulley menu lies out of sight over the flickable above: Tab passes its items
+    // by and they take no presses from the slider there.
+    Flickable {
+        id: pulleyFlick
+        y: 1720; width: root.width; height: 80; contentHeight: 80
+        PullDownMenu { MenuItem { id: pulleyItem; text: "Hidden" } }
+    }
+
     Flickable {
         id: flick
         y: 1400; width: root.width; height: 300; contentHeight: 2000
@@ -145,18 +153,25 @@ Item {
             controls.LayoutMirroring.enabled = false
         }
 
-        // Tab and Shift+Tab walk the controls in order; a tap does not take the focus.
+        // Tab and Shift+Tab walk the controls in order, shown as focused; a tap does not take
+        // the focus, focus given otherwise shows nothing; a closed pulley menu is passed by.
         function test_tab() {
             button.forceActiveFocus()
+            verify(!button.visualFocus)
             var order = [button, toggle, slider, combo]
             for (var i = 1; i < order.length; ++i) {
                 keyClick(Qt.Key_Tab)
-                verify(order[i].activeFocus, "Tab to " + i)
+                verify(order[i].activeFocus && order[i].visualFocus, "Tab to " + i)
+                verify(!order[i - 1].visualFocus)
             }
             keyClick(Qt.Key_Backtab)
-            verify(slider.activeFocus)
+            verify(slider.activeFocus && slider.visualFocus)
             mouseClick(button)
             verify(slider.activeFocus)
+            for (i = 0; i < 30; ++i) {
+                keyClick(Qt.Key_Tab)
+                verify(!pulleyItem.activeFocus, "Tab " + i + " reached a closed pulley menu")
+            }
         }
 
         // Presses of a button: what a click, a held press, a checkable button, a repeating

@@ -76,6 +76,39 @@ Item {
                 keyClick(text.charAt(i))
         }
 
+        // Tab walks the fields (a tab is never typed), Shift+Tab walks back; right to left the
+        // search and password buttons change sides.
+        function test_tabAndMirroring() {
+            plain.forceActiveFocus()
+            var reached = []
+            for (var i = 0; i < 6 && !area.editor.activeFocus; ++i) {
+                keyClick(Qt.Key_Tab)
+                ;[secret, search, area].forEach(function(f) { if (f.editor.activeFocus) reached.push(f) })
+            }
+            compare(reached, [secret, search, area])
+            keyClick(Qt.Key_Tab)
+            compare(area.text, "")
+            verify(!area.editor.activeFocus)
+            keyClick(Qt.Key_Backtab)
+            verify(area.editor.activeFocus)
+            var side = function(field, source) {
+                for (var i = 0; i < field.children.length; ++i) {
+                    var child = field.children[i]
+                    if (String(child.source || child.iconSource || "").indexOf(source) >= 0)
+                        return child.x + child.width / 2 < field.width / 2 ? "left" : "right"
+                }
+                return "none"
+            }
+            form.LayoutMirroring.childrenInherit = true
+            for (var mirrored = 0; mirrored < 2; ++mirrored) {
+                form.LayoutMirroring.enabled = !!mirrored
+                compare(side(search, "icon-m-search"), mirrored ? "right" : "left")
+                compare(side(secret, "icon-m-visible"), mirrored ? "left" : "right")
+                verify(secret.editor.x > 0 && secret.editor.x + secret.editor.width < secret.width)
+            }
+            form.LayoutMirroring.enabled = false
+        }
+
         function test_typing_data() {
             return [
                 { tag: "text field", field: plain, typed: "ab", text: "ab", tag2: "plain" },

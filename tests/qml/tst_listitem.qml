@@ -87,11 +87,16 @@ Item {
             mouseRelease(row(1), 100, 10)
         }
 
+        // Return and Space click; the Menu key opens the menu with its item focused.
         function test_keys() {
             row(2).forceActiveFocus()
             keyClick(Qt.Key_Return)
             keyClick(Qt.Key_Space)
-            compare(root.log, ["clicked 2", "clicked 2"])
+            keyClick(Qt.Key_Menu)
+            verify(row(2).menuOpen)
+            keyClick(Qt.Key_Return)
+            tryCompare(row(2), "menuOpen", false)
+            compare(root.log, ["clicked 2", "clicked 2", "delete 2"])
         }
 
         // Text at the start (after the icon, where there is one), the description under it,

@@ -30,7 +30,7 @@ Private.ButtonBase {
     Rectangle {
         anchors.fill: parent
         radius: height / 2
-        color: button.down ? button.highlightBackgroundColor : button.backgroundColor
+        color: button.down || button.visualFocus ? button.highlightBackgroundColor : button.backgroundColor
     }
 
     Text {
@@ -38,7 +38,7 @@ Private.ButtonBase {
         anchors.centerIn: parent
         width: Math.min(implicitWidth, button.width - 2 * Theme.paddingMedium)
         text: button.text
-        color: button.down ? button.highlightColor : button.color
+        color: button.down || button.visualFocus ? button.highlightColor : button.color
         font.pixelSize: Theme.fontSizeMedium
         elide: Text.ElideRight
     }

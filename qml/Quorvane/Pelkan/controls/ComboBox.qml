@@ -77,7 +77,7 @@ Private.ButtonBase {
                 anchors { left: parent.left; right: parent.right }
                 Text {
                     text: combo.label
-                    color: combo.down ? combo.palette.highlightColor : combo.palette.primaryColor
+                    color: combo.down || combo.visualFocus ? combo.palette.highlightColor : combo.palette.primaryColor
                     font.pixelSize: Theme.fontSizeMedium
                 }
                 Text {

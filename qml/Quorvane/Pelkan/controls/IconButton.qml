@@ -31,6 +31,6 @@ Private.ButtonBase {
         sourceSize: Qt.size(width, height)
         source: button.iconSource === "" ? ""
               : button.iconSource + (button.iconSource.indexOf("?") < 0 ? "?" : "")
-                + (button.down ? button.highlightColor : button.color)
+                + (button.down || button.visualFocus ? button.highlightColor : button.color)
     }
 }

@@ -66,7 +66,7 @@ Private.RangeBase {
         x: track.x + track.width * slider.visualPosition - width / 2
         y: track.y + track.height / 2 - height / 2
         color: slider.palette.highlightColor
-        scale: slider.pressed ? 1.3 : 1
+        scale: slider.pressed || slider.visualFocus ? 1.3 : 1
         Behavior on scale { NumberAnimation { duration: 100 } }
     }
 

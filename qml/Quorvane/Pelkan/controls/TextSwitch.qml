@@ -64,7 +64,7 @@ Private.ButtonBase {
         Text {
             width: parent.width
             text: row.text
-            color: row.down ? row.palette.highlightColor : row.palette.primaryColor
+            color: row.down || row.visualFocus ? row.palette.highlightColor : row.palette.primaryColor
             font.pixelSize: Theme.fontSizeMedium
             wrapMode: Text.Wrap
         }
@@ -72,7 +72,7 @@ Private.ButtonBase {
             visible: text !== ""
             width: parent.width
             text: row.description
-            color: row.down ? row.palette.secondaryHighlightColor : row.palette.secondaryColor
+            color: row.down || row.visualFocus ? row.palette.secondaryHighlightColor : row.palette.secondaryColor
             font.pixelSize: Theme.fontSizeSmall
             wrapMode: Text.Wrap
         }

@@ -57,7 +57,7 @@ Private.ControlBase {
         Text {
             anchors { left: parent.left; leftMargin: Theme.horizontalPageMargin; verticalCenter: parent.verticalCenter }
             text: cancelButton.text
-            color: cancelButton.down ? header.palette.highlightColor : header.palette.primaryColor
+            color: cancelButton.down || cancelButton.visualFocus ? header.palette.highlightColor : header.palette.primaryColor
             font.pixelSize: Theme.fontSizeLarge
         }
     }
@@ -75,7 +75,7 @@ Private.ControlBase {
         Text {
             anchors { right: parent.right; rightMargin: Theme.horizontalPageMargin; verticalCenter: parent.verticalCenter }
             text: acceptButton.text
-            color: acceptButton.down ? header.palette.highlightColor : header.palette.primaryColor
+            color: acceptButton.down || acceptButton.visualFocus ? header.palette.highlightColor : header.palette.primaryColor
             opacity: acceptButton.enabled ? 1 : 0.4
             font.pixelSize: Theme.fontSizeLarge
         }

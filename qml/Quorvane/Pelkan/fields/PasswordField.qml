@@ -14,11 +14,20 @@ TextField {
     label: qsTrId("quorvanepelkan-la-password")
     echoMode: passwordVisible ? TextInput.Normal : TextInput.Password
     inputMethodHints: Qt.ImhNoPredictiveText | Qt.ImhSensitiveData | Qt.ImhNoAutoUppercase
-    rightPadding: Theme.horizontalPageMargin + (showEchoModeToggle ? Theme.iconSizeMedium + Theme.paddingSmall : 0)
+    // The toggle sits after the text: at the right, at the left right to left.
+    leftPadding: internal.mirrored ? internal.toggleSide : Theme.horizontalPageMargin
+    rightPadding: internal.mirrored ? Theme.horizontalPageMargin : internal.toggleSide
+
+    QtObject {
+        id: internal
+        readonly property bool mirrored: field.LayoutMirroring.enabled
+        readonly property real toggleSide: Theme.horizontalPageMargin
+                                           + (field.showEchoModeToggle ? Theme.iconSizeMedium + Theme.paddingSmall : 0)
+    }
 
     IconButton {
         visible: field.showEchoModeToggle
-        x: field.width - field.rightPadding + Theme.paddingSmall
+        x: internal.mirrored ? field.leftPadding - width - Theme.paddingSmall : field.width - field.rightPadding + Theme.paddingSmall
         y: field.topPadding + (field.editor.height - height) / 2
         width: Theme.iconSizeMedium
         height: Theme.iconSizeMedium

@@ -2,7 +2,7 @@ import QtQuick 2.6
 import Quorvane.Pelkan 1.0
 
 // A field for searching: a search icon before the text, a clear button after it while
-// there is text, no underline label, and what was searched for remembered (on Enter) and
+// there is text (mirrored right to left), no underline label, and what was searched for remembered (on Enter) and
 // offered back while typing.
 //
 // Searches are remembered by default, one list per application and kind of page: the
@@ -28,6 +28,8 @@ TextField {
         id: defaults
 
         property string key
+        // Right to left the search icon sits at the right and the clear button at the left.
+        readonly property bool mirrored: field.LayoutMirroring.enabled
 
         function pageKindKey() {
             var kind = ""
@@ -45,7 +47,8 @@ TextField {
     }
 
     Image {
-        x: field.leftPadding - width - Theme.paddingSmall
+        x: defaults.mirrored ? field.width - field.rightPadding + Theme.paddingSmall
+                             : field.leftPadding - width - Theme.paddingSmall
         y: field.topPadding + (field.editor.height - height) / 2
         width: Theme.iconSizeMedium
         height: Theme.iconSizeMedium
@@ -55,7 +58,8 @@ TextField {
 
     IconButton {
         visible: field.text !== ""
-        x: field.width - field.rightPadding + Theme.paddingSmall
+        x: defaults.mirrored ? field.leftPadding - width - Theme.paddingSmall
+                             : field.width - field.rightPadding + Theme.paddingSmall
         y: field.topPadding + (field.editor.height - height) / 2
         width: Theme.iconSizeMedium
         height: Theme.iconSizeMedium

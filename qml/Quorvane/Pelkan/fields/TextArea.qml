@@ -42,11 +42,26 @@ Private.TextBaseItem {
     placeholderItem: placeholder
     labelItem: labelText
 
+    QtObject {
+        id: internal
+
+        function focusNext(forward) {
+            var next = edit.nextItemInFocusChain(forward)
+            if (next && next !== edit)
+                next.forceActiveFocus(forward ? Qt.TabFocusReason : Qt.BacktabFocusReason)
+        }
+    }
+
     TextEdit {
         id: edit
         objectName: "textEditor"
         focus: true
+        activeFocusOnTab: true
         wrapMode: TextEdit.Wrap
+        // Tab and Shift+Tab go on to the next or previous control, as from any field of a
+        // form, rather than typing a tab.
+        Keys.onTabPressed: internal.focusNext(true)
+        Keys.onBacktabPressed: internal.focusNext(false)
         color: field.highlighted ? field.palette.highlightColor : field.palette.primaryColor
         selectionColor: Theme.rgba(field.palette.highlightColor, 0.4)
         selectedTextColor: field.palette.highlightColor

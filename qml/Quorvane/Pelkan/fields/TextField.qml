@@ -184,6 +184,7 @@ Private.TextBaseItem {
         // The field scrolls the text (animated, with the cursor) once it no longer fits.
         autoScroll: false
         focus: true
+        activeFocusOnTab: true
         color: field.highlighted ? field.palette.highlightColor : field.palette.primaryColor
         selectionColor: Theme.rgba(field.palette.highlightColor, 0.4)
         selectedTextColor: field.palette.highlightColor

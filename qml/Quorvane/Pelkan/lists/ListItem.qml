@@ -12,6 +12,7 @@ import Quorvane.Pelkan.private 1.0 // for the RemorseCache attached to the view
     Highlighted while pressed (until a swipe over it begins), clicked on release or by Space,
     Enter and Return while focused. A long press opens its `menu` (a ContextMenu, or a
     component making one) below it, pushing the rows below aside; a press outside closes it.
+    From the keyboard the Menu key (or Shift+F10) opens it with its first item focused.
     With `text` (and `description`, `iconSource`) the row lays itself out as the theme says:
     the icon at the start, the words beside it in the palette's colours, highlighted while
     the row is. Declared children are the row's content instead, for rows of their own.
@@ -113,7 +114,7 @@ Private.ButtonBase {
     accessibleRole: Accessible.ListItem
     width: parent ? parent.width : 0
     height: contentHeight + (menuOpen ? internal.menuItem.height : 0)
-    highlighted: (down && !internal.swiped) || menuOpen
+    highlighted: (down && !internal.swiped) || menuOpen || visualFocus
 
     onPressed: {
         internal.pressX = pressX
@@ -125,6 +126,20 @@ Private.ButtonBase {
     onPressXChanged: internal.checkSwipe()
     onPressYChanged: internal.checkSwipe()
     onPressAndHold: if (showMenuOnPressAndHold && menu) openMenu()
+    // The Menu key (or Shift+F10) opens the menu from the keyboard, its first item focused.
+    Keys.onPressed: {
+        var menuKey = event.key === Qt.Key_Menu || (event.key === Qt.Key_F10 && (event.modifiers & Qt.ShiftModifier))
+        if (!menuKey || !menu || !openMenu()) {
+            event.accepted = false
+            return
+        }
+        for (var first = item.nextItemInFocusChain(true), above = first; above; above = above.parent) {
+            if (above === internal.menuItem) {
+                first.forceActiveFocus(Qt.TabFocusReason)
+                break
+            }
+        }
+    }
     onMenuOpenChanged: {
         if (!menuOpen && internal.closer) {
             internal.closer.destroy()

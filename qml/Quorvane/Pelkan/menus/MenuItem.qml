@@ -10,7 +10,8 @@ import Quorvane.Pelkan.private 1.0 as Private
     Highlighted while the finger would pick it (pulley menus pick on release, once the
     content has settled) or while pressed. In a context menu a tap, or Space, Enter and
     Return while it is focused, picks it: the menu closes and clicked() follows. Its menu is
-    the Private.MenuColumn it sits in.
+    the Private.MenuColumn it sits in. Tab reaches the items of a context menu; those of a
+    pulley menu, out of sight beyond the content's edge, it passes by.
 */
 Private.ButtonBase {
     id: item
@@ -23,7 +24,7 @@ Private.ButtonBase {
     width: parent ? parent.width : 0
     height: Theme.itemSizeSmall * 0.75
     opacity: enabled ? 1 : 0.4
-    highlighted: (internal.menu !== null && internal.menu.highlightedItem === item) || down
+    highlighted: (internal.menu !== null && internal.menu.highlightedItem === item) || down || visualFocus
 
     // A menu that picks by a tap hears of it before clicked(), so that it closes first.
     onReleased: if (internal.menu !== null && internal.menu.tapToPick) internal.menu.picked(item)

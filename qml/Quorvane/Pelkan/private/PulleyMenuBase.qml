@@ -217,6 +217,8 @@ Item {
         id: column
         y: Theme.paddingLarge
         width: host.width
+        // Out of sight, its items take no presses and no Tab.
+        enabled: host.dragDistance > 0
     }
 
     // The busy line, at the content's edge in the view, shown whatever the menu does.

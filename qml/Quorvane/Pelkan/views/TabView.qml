@@ -60,7 +60,7 @@ Item {
                         width: Math.min(implicitWidth, tab.width - Theme.paddingMedium)
                         elide: Text.ElideRight
                         text: tab.text
-                        color: tab.down || tab.highlighted ? tab.palette.highlightColor : tab.palette.primaryColor
+                        color: tab.down || tab.visualFocus || tab.highlighted ? tab.palette.highlightColor : tab.palette.primaryColor
                         font.pixelSize: Theme.fontSizeMedium
                     }
                 }
