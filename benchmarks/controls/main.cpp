@@ -11,6 +11,7 @@
 //
 //   pelkan-controls-bench                         everything; prints medians and ratios
 //   pelkan-controls-bench --memory CONTROL KIND   one memory measurement; prints KB per control
+//   pelkan-controls-bench --repeat CONTROL KIND N creates that page N times, for a profiler
 
 #include "../common/median.h"
 #include "../common/summary.h"
@@ -120,17 +121,43 @@ double createOnce(QQuickView &view, QQmlComponent &component)
     return ms;
 }
 
-int measureMemory(const QString &name, const QString &kindName)
+// The control and the kind named on the command line; false when one is not known.
+bool lookUp(const QString &name, const QString &kindName, const Control **control, int *kind)
 {
-    const Control *control = nullptr;
+    *control = nullptr;
     for (const Control &candidate : Controls) {
         if (name == QLatin1String(candidate.name))
-            control = &candidate;
+            *control = &candidate;
     }
-    int kind = 0;
-    while (kind < 3 && kindName != QLatin1String(Kinds[kind]))
-        ++kind;
-    if (!control || kind == 3)
+    *kind = 0;
+    while (*kind < 3 && kindName != QLatin1String(Kinds[*kind]))
+        ++*kind;
+    return *control && *kind < 3;
+}
+
+int repeat(const QString &name, const QString &kindName, int times)
+{
+    const Control *control;
+    int kind;
+    if (!lookUp(name, kindName, &control, &kind))
+        return 2;
+    QQuickView view;
+    if (!prepare(view))
+        return 1;
+    QQmlComponent page(view.engine());
+    page.setData(document(*control, kind, control->count), QUrl());
+    double total = 0;
+    for (int i = 0; i < times; ++i)
+        total += createOnce(view, page);
+    QTextStream(stdout) << total / qMax(1, times) << Qt::endl;
+    return 0;
+}
+
+int measureMemory(const QString &name, const QString &kindName)
+{
+    const Control *control;
+    int kind;
+    if (!lookUp(name, kindName, &control, &kind))
         return 2;
     QQuickView view;
     if (!prepare(view))
@@ -214,6 +241,9 @@ int main(int argc, char *argv[])
     const int memoryAt = args.indexOf(QStringLiteral("--memory"));
     if (memoryAt > 0 && memoryAt + 2 < args.size())
         return measureMemory(args.at(memoryAt + 1), args.at(memoryAt + 2));
+    const int repeatAt = args.indexOf(QStringLiteral("--repeat"));
+    if (repeatAt > 0 && repeatAt + 3 < args.size())
+        return repeat(args.at(repeatAt + 1), args.at(repeatAt + 2), args.at(repeatAt + 3).toInt());
     QTextStream out(stdout);
 
     // Creation: one view and engine per kind, the types loaded and caches warm before timing.
