@@ -2,6 +2,7 @@
 
 #include <QFocusEvent>
 #include <QGuiApplication>
+#include <QSet>
 #include <QStyleHints>
 #include <QtQml/qqml.h>
 // Qt's accessible attached type is written with the emit keyword, which this build leaves out.
@@ -13,18 +14,58 @@
 
 namespace Pelkan {
 
+namespace {
+
+// One observer for every control: Qt keeps its observers in a list it searches on each
+// install and removal, which a page of hundreds of controls would pay for quadratically.
+class ActivationObservers : public QAccessible::ActivationObserver
+{
+public:
+    void add(ControlBase *control)
+    {
+        if (!m_installed) {
+            QAccessible::installActivationObserver(this);
+            m_installed = true;
+        }
+        m_controls.insert(control);
+    }
+    void remove(ControlBase *control) { m_controls.remove(control); }
+
+    void accessibilityActiveChanged(bool active) override
+    {
+        const QSet<ControlBase *> controls = m_controls; // a control may go meanwhile
+        for (ControlBase *control : controls) {
+            if (m_controls.contains(control))
+                control->accessibilityActiveChanged(active);
+        }
+    }
+
+private:
+    QSet<ControlBase *> m_controls;
+    bool m_installed = false;
+};
+
+ActivationObservers &activationObservers()
+{
+    // Left to the end of the process: Qt may still hold it while its own globals go.
+    static ActivationObservers *observers = new ActivationObservers;
+    return *observers;
+}
+
+} // namespace
+
 ControlBase::ControlBase(QQuickItem *parent)
     : Control(parent)
 {
     setFlag(ItemIsFocusScope);
-    QAccessible::installActivationObserver(this);
+    activationObservers().add(this);
     // Highlighted reads as selected: the current tab, the row whose menu is open.
     connect(this, &Control::highlightedChanged, this, [this] { setAccessibleState("selected", highlighted()); });
 }
 
 ControlBase::~ControlBase()
 {
-    QAccessible::removeActivationObserver(this);
+    activationObservers().remove(this);
 }
 
 void ControlBase::setText(const QString &text)

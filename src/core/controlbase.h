@@ -23,7 +23,7 @@ namespace Pelkan {
 // - inherits its palette from the nearest control above it (a page, a list item).
 // Look in QML, behaviour here: keys, presses and values are handled by the bases derived
 // from this one (ButtonBase, RangeBase).
-class ControlBase : public Control, public QAccessible::ActivationObserver
+class ControlBase : public Control
 {
     Q_OBJECT
     // The control's words: a button's label, a row's title. Also its accessible name.
@@ -59,7 +59,9 @@ public:
     int accessibleRole() const;
     void setAccessibleRole(int role);
 
-    void accessibilityActiveChanged(bool active) override;
+    // Assistive technology started (or stopped): hands the control's role, name and states
+    // over. Every control alive hears of it through one observer of the toolkit's.
+    void accessibilityActiveChanged(bool active);
 
 Q_SIGNALS:
     void textChanged();

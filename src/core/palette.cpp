@@ -1,14 +1,64 @@
 #include "palette.h"
 
+#include <QSet>
+
 namespace Pelkan {
+
+// The palettes that follow the theme, told of its changes through one set of connections.
+class ThemePalettes : public QObject
+{
+public:
+    static ThemePalettes *instance()
+    {
+        // Left to the end of the process, as the theme is.
+        static ThemePalettes *palettes = new ThemePalettes;
+        return palettes;
+    }
+
+    void add(Palette *palette) { m_palettes.insert(palette); }
+    void remove(Palette *palette) { m_palettes.remove(palette); }
+
+private:
+    ThemePalettes()
+    {
+        Theme *theme = Theme::instance();
+        for (int role = 0; role < Theme::ColorRoleCount; ++role)
+            connect(theme, Theme::colorSignal(Theme::ColorRole(role)), this, &ThemePalettes::themeChanged);
+        connect(theme, &Theme::colorSchemeChanged, this, &ThemePalettes::themeChanged);
+    }
+
+    void themeChanged()
+    {
+        const QSet<Palette *> palettes = m_palettes; // a handler may make or delete palettes
+        for (Palette *palette : palettes) {
+            if (m_palettes.contains(palette))
+                palette->sourceChanged();
+        }
+    }
+
+    QSet<Palette *> m_palettes;
+};
 
 Palette::Palette(QObject *parent)
     : QObject(parent)
 {
-    connectSource(Theme::instance(), true);
+    ThemePalettes::instance()->add(this);
     for (int role = 0; role < Theme::ColorRoleCount; ++role)
         m_seen[role] = sourceColor(Theme::ColorRole(role));
     m_seenScheme = sourceScheme();
+}
+
+Palette::~Palette()
+{
+    follow(nullptr);
+    ThemePalettes::instance()->remove(this);
+    // Those still inheriting from this one follow the theme from now on.
+    const QVector<Palette *> dependents = m_dependents;
+    for (Palette *dependent : dependents) {
+        dependent->m_inherited = nullptr;
+        ThemePalettes::instance()->add(dependent);
+        dependent->sourceChanged();
+    }
 }
 
 void (Palette::*Palette::colorSignal(Theme::ColorRole role))()
@@ -67,10 +117,21 @@ void Palette::setInheritedPalette(Palette *palette)
 {
     if (palette == m_inherited || palette == this)
         return;
-    connectSource(m_inherited ? static_cast<QObject *>(m_inherited) : Theme::instance(), false);
-    m_inherited = palette;
-    connectSource(m_inherited ? static_cast<QObject *>(m_inherited) : Theme::instance(), true);
+    follow(palette);
     sourceChanged();
+}
+
+void Palette::follow(Palette *source)
+{
+    if (m_inherited)
+        m_inherited->m_dependents.removeOne(this);
+    else
+        ThemePalettes::instance()->remove(this);
+    m_inherited = source;
+    if (m_inherited)
+        m_inherited->m_dependents.append(this);
+    else
+        ThemePalettes::instance()->add(this);
 }
 
 QColor Palette::sourceColor(Theme::ColorRole role) const
@@ -83,46 +144,31 @@ Theme::ColorScheme Palette::sourceScheme() const
     return m_inherited ? m_inherited->colorScheme() : Theme::instance()->colorScheme();
 }
 
-void Palette::connectSource(QObject *source, bool connect)
-{
-    if (!source)
-        return;
-    if (!connect) {
-        QObject::disconnect(source, nullptr, this, nullptr);
-        return;
-    }
-    // Any colour or scheme change of the source re-resolves this palette; only the roles
-    // whose visible value changed are announced.
-    if (auto palette = qobject_cast<Palette *>(source)) {
-        for (int role = 0; role < Theme::ColorRoleCount; ++role)
-            QObject::connect(palette, colorSignal(Theme::ColorRole(role)), this, &Palette::sourceChanged);
-        QObject::connect(palette, &Palette::colorSchemeChanged, this, &Palette::sourceChanged);
-        QObject::connect(palette, &QObject::destroyed, this, [this] {
-            // The guarded pointer is already null here: fall back to the theme.
-            m_inherited = nullptr;
-            connectSource(Theme::instance(), true);
-            sourceChanged();
-        });
-    } else if (auto theme = qobject_cast<Theme *>(source)) {
-        for (int role = 0; role < Theme::ColorRoleCount; ++role)
-            QObject::connect(theme, Theme::colorSignal(Theme::ColorRole(role)), this, &Palette::sourceChanged);
-        QObject::connect(theme, &Theme::colorSchemeChanged, this, &Palette::sourceChanged);
-    }
-}
-
+// Re-resolves every colour, announces those whose visible value changed and, if any did,
+// passes the change on to the palettes inheriting from this one.
 void Palette::sourceChanged()
 {
+    bool changed = false;
     for (int role = 0; role < Theme::ColorRoleCount; ++role) {
         const QColor now = color(Theme::ColorRole(role));
         if (now != m_seen[role]) {
             m_seen[role] = now;
+            changed = true;
             Q_EMIT (this->*colorSignal(Theme::ColorRole(role)))();
         }
     }
     const Theme::ColorScheme scheme = colorScheme();
     if (scheme != m_seenScheme) {
         m_seenScheme = scheme;
+        changed = true;
         Q_EMIT colorSchemeChanged();
+    }
+    if (!changed)
+        return;
+    const QVector<Palette *> dependents = m_dependents; // a handler may move or delete them
+    for (Palette *dependent : dependents) {
+        if (m_dependents.contains(dependent))
+            dependent->sourceChanged();
     }
 }
 

@@ -4,13 +4,18 @@
 
 #include <QColor>
 #include <QObject>
-#include <QPointer>
+#include <QVector>
 
 namespace Pelkan {
 
 // The colours an item draws with. Each colour follows its source (the palette it inherits
 // from, otherwise the process theme) until it is set, and follows it again once reset.
 // Controls inherit the palette of their nearest ancestor control.
+//
+// A page of hundreds of controls makes a palette for each, so following costs no signal
+// connections: a palette tells the palettes inheriting from it directly, and the palettes
+// that follow the theme hear of its changes through one connection the theme has for all
+// of them.
 class Palette : public QObject
 {
     Q_OBJECT
@@ -26,6 +31,7 @@ class Palette : public QObject
 
 public:
     explicit Palette(QObject *parent = nullptr);
+    ~Palette() override;
 
     QColor color(Theme::ColorRole role) const;
     void setColor(Theme::ColorRole role, const QColor &color);
@@ -76,20 +82,22 @@ Q_SIGNALS:
     void backgroundColorChanged();
     void colorSchemeChanged();
 
-private Q_SLOTS:
-    void sourceChanged();
-
 private:
+    friend class ThemePalettes;
+
     static void (Palette::*colorSignal(Theme::ColorRole role))();
     QColor sourceColor(Theme::ColorRole role) const;
     Theme::ColorScheme sourceScheme() const;
-    void connectSource(QObject *source, bool connect);
+    void follow(Palette *source);
+    void sourceChanged();
 
     QColor m_colors[Theme::ColorRoleCount];
     Theme::ColorScheme m_scheme = Theme::LightOnDark;
     unsigned m_set = 0;
     bool m_schemeSet = false;
-    QPointer<Palette> m_inherited;
+    Palette *m_inherited = nullptr;
+    // The palettes inheriting from this one.
+    QVector<Palette *> m_dependents;
     // What readers saw last, so that a source change notifies only what really changed.
     QColor m_seen[Theme::ColorRoleCount];
     Theme::ColorScheme m_seenScheme;
