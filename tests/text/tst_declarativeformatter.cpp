@@ -135,19 +135,6 @@ private Q_SLOTS:
         QCOMPARE(F().formatDate(value, type), expected.startsWith(QLatin1String("warning: ")) ? QString() : expected);
     }
 
-    void durationSweepMatchesLocale()
-    {
-        // Every minute and second field, padded or not, as the locale's time formatter writes it.
-        F formatter;
-        const QLocale locale;
-        for (int seconds = 0; seconds < 3 * 3600; seconds += 37) {
-            const QTime rest = QTime(0, 0).addSecs(seconds % 3600);
-            QCOMPARE(formatter.formatDuration(seconds, F::DurationLong),
-                     QString::number(seconds / 3600) + QLatin1Char(':') + locale.toString(rest, QStringLiteral("mm:ss")));
-            QCOMPARE(formatter.formatDuration(seconds, F::DurationShort), locale.toString(rest, QStringLiteral("m:ss")));
-        }
-    }
-
     void translatedPatterns_data()
     {
         QTest::addColumn<QByteArray>("id");
