@@ -44,6 +44,8 @@ struct PublishedProperty {
     QVariant value;
 };
 
+// The application window: orientation, configuration read at start (with the screen's size
+// category it depends on), events, publications to the home screen, the cover and its window.
 class tst_DeclarativeWindow : public QObject
 {
     Q_OBJECT
@@ -53,6 +55,7 @@ private Q_SLOTS:
     {
         QVERIFY(ConfigFixture::reset(AngleKey));
         QVERIFY(ConfigFixture::reset(AllowedKey));
+        QVERIFY(ConfigFixture::reset(DiagonalKey));
         m_published.clear();
     }
 
@@ -163,6 +166,46 @@ private Q_SLOTS:
         QCOMPARE(window.deviceOrientation(), O::Landscape);
         QCOMPARE(window.orientation(), O::Landscape);
         QCOMPARE(allowedChanged.count() + deviceChanged.count(), 0);
+    }
+
+    void sizeCategoryForDiagonal_data()
+    {
+        QTest::addColumn<qreal>("inches");
+        QTest::addColumn<int>("category");
+        QTest::newRow("just below medium") << 4.49 << int(Pelkan::Screen::Small);
+        QTest::newRow("medium starts") << 4.5 << int(Pelkan::Screen::Medium);
+        QTest::newRow("large starts") << 7.0 << int(Pelkan::Screen::Large);
+        QTest::newRow("extra large starts") << 11.0 << int(Pelkan::Screen::ExtraLarge);
+        QTest::newRow("monitor") << 24.0 << int(Pelkan::Screen::ExtraLarge);
+    }
+
+    void sizeCategoryForDiagonal()
+    {
+        QFETCH(qreal, inches);
+        QFETCH(int, category);
+        QCOMPARE(int(Pelkan::Screen::categoryForDiagonal(inches)), category);
+    }
+
+    // A configured diagonal overrides the display's and moves the size category; an
+    // unusable one gives the display's own measurement back.
+    void configuredDiagonal()
+    {
+        using Pelkan::Screen;
+        const qreal display = Screen().diagonal();
+        Screen screen;
+        QVERIFY(ConfigFixture::write(DiagonalKey, QStringLiteral("5.5")));
+        QTRY_COMPARE(screen.diagonal(), 5.5);
+        QCOMPARE(screen.sizeCategory(), Screen::Medium);
+
+        QSignalSpy changed(&screen, &Screen::sizeCategoryChanged);
+        QVERIFY(ConfigFixture::write(DiagonalKey, QStringLiteral("10.0")));
+        QTRY_COMPARE(changed.count(), 1);
+        QCOMPARE(screen.sizeCategory(), Screen::Large);
+        QTRY_COMPARE(Screen::instance()->sizeCategory(), Screen::Large);
+
+        QTest::ignoreMessage(QtWarningMsg, QRegularExpression(QStringLiteral("^Screen: ignoring invalid diagonal")));
+        QVERIFY(ConfigFixture::write(DiagonalKey, QStringLiteral("-3.0")));
+        QTRY_COMPARE(screen.diagonal(), display);
     }
 
     void defaultAllowedOrientations_data()
