@@ -42,6 +42,7 @@ protected:
 struct PublishedProperty {
     QString name;
     QVariant value;
+    QWindow *window;
 };
 
 // The application window: orientation, configuration read at start (with the screen's size
@@ -358,9 +359,10 @@ private Q_SLOTS:
         QCOMPARE(window->backgroundColor(), QColor(Qt::darkCyan));
     }
 
-    // A cover window attached to the application window: the home screen is told, the two
-    // pair, the cover shows while the application is away (or always, as the primary window)
-    // and publishes each change of its transparency once; its end is announced too.
+    // A cover window finds its cover and publishes each change of its transparency once.
+    // Attached to the application window: the home screen is told, the two pair, the cover
+    // shows while the application is away (or always, as the primary window), and its end
+    // is announced too.
     void coverAttachAndDestroy()
     {
         record(QStringLiteral("wayland"));
@@ -371,38 +373,41 @@ private Q_SLOTS:
         auto coverWindow = new DeclarativeCoverWindow;
         QQuickWindow::setDefaultAlphaBuffer(false);
         auto cover = new DeclarativeCover(coverWindow->contentItem());
-        QCOMPARE(coverWindow->cover(), cover);
-
-        m_published.clear();
-        window->_setCover(coverWindow);
-        QCOMPARE(m_published.first().name, QStringLiteral("QUORVANE_RETAIN_COVER"));
-        QCOMPARE(m_published.first().value, QVariant(true));
-        QCOMPARE(m_published.at(3).name, QStringLiteral("QUORVANE_COVER_WINDOW"));
-        QCOMPARE(m_published.at(3).value.toULongLong(), qulonglong(coverWindow->winId()));
-        // The home screen is told there is a cover with the same publication.
-        QCOMPARE(m_published.at(4).name, QStringLiteral("QUORVANE_HAVE_COVER"));
-        QCOMPARE(m_published.at(4).value, QVariant(true));
-        QCOMPARE(switcher.count(), 1);
-        QCOMPARE(switcher.last().first().value<QQuickWindow *>(), coverWindow);
-        QCOMPARE(coverWindow->mainWindow(), window);
-
-        // The application is in the foreground: its cover is not on show until it leaves.
-        QVERIFY(!window->coverVisible());
-        QVERIFY(!coverWindow->isVisible());
-        m_window->hide();
-        QVERIFY(window->coverVisible());
+        coverWindow->show();
         QVERIFY(QTest::qWaitForWindowExposed(coverWindow));
+        QCOMPARE(coverWindow->cover(), cover);
         QCOMPARE(coverWindow->windowReference(), QStringLiteral("__winref:%1").arg(coverWindow->winId()));
         m_published.clear();
         cover->setTransparent(true);
         cover->setTransparent(true);
         cover->setTransparent(false);
         QVariantList transparent;
-        for (const PublishedProperty &property : qAsConst(m_published)) {
+        for (const PublishedProperty &property : publishedBy(coverWindow)) {
             if (property.name == QLatin1String("TRANSPARENT"))
                 transparent << property.value;
         }
         QCOMPARE(transparent, QVariantList({ true, false }));
+        coverWindow->hide();
+
+        m_published.clear();
+        window->_setCover(coverWindow);
+        QVector<PublishedProperty> own = publishedBy(m_window.data());
+        QCOMPARE(own.first().name, QStringLiteral("QUORVANE_RETAIN_COVER"));
+        QCOMPARE(own.first().value, QVariant(true));
+        QCOMPARE(own.at(3).name, QStringLiteral("QUORVANE_COVER_WINDOW"));
+        QCOMPARE(own.at(3).value.toULongLong(), qulonglong(coverWindow->winId()));
+        // The home screen is told there is a cover with the same publication.
+        QCOMPARE(own.at(4).name, QStringLiteral("QUORVANE_HAVE_COVER"));
+        QCOMPARE(own.at(4).value, QVariant(true));
+        QCOMPARE(switcher.count(), 1);
+        QCOMPARE(switcher.last().first().value<QQuickWindow *>(), coverWindow);
+        QCOMPARE(coverWindow->mainWindow(), window);
+
+        // The application is in the foreground: its cover is not on show until it leaves.
+        QVERIFY(!window->coverVisible());
+        m_window->hide();
+        QVERIFY(window->coverVisible());
+        QTRY_VERIFY(coverWindow->isVisible());
         window->setCoverIsPrimaryWindow(true);
         m_window->show();
         QVERIFY(window->coverVisible());
@@ -410,9 +415,10 @@ private Q_SLOTS:
         m_published.clear();
         delete coverWindow;
         QVERIFY(!window->coverWindow());
-        QCOMPARE(m_published.first().name, QStringLiteral("QUORVANE_RETAIN_COVER"));
-        QCOMPARE(m_published.first().value, QVariant(false));
-        QCOMPARE(m_published.at(4).value, QVariant(false));
+        own = publishedBy(m_window.data());
+        QCOMPARE(own.first().name, QStringLiteral("QUORVANE_RETAIN_COVER"));
+        QCOMPARE(own.first().value, QVariant(false));
+        QCOMPARE(own.at(4).value, QVariant(false));
         QVERIFY(!window->haveCoverHint());
         QVERIFY(!window->coverVisible());
         QCOMPARE(switcher.count(), 2);
@@ -538,10 +544,17 @@ private:
         QVERIFY(QDBusConnection::sessionBus().send(signal));
     }
 
+    QVector<PublishedProperty> publishedBy(QWindow *window) const
+    {
+        QVector<PublishedProperty> own;
+        std::copy_if(m_published.cbegin(), m_published.cend(), std::back_inserter(own),
+                     [window](const PublishedProperty &property) { return property.window == window; });
+        return own;
+    }
     void record(const QString &platform)
     {
-        WindowPropertyPublisher::setSinkForTesting([this](QWindow *, const QString &name, const QVariant &value) {
-            m_published.append({ name, value });
+        WindowPropertyPublisher::setSinkForTesting([this](QWindow *window, const QString &name, const QVariant &value) {
+            m_published.append({ name, value, window });
         }, platform);
     }
     QScopedPointer<QQuickWindow> m_window;
