@@ -52,6 +52,7 @@ private Q_SLOTS:
         QTest::newRow("private plus a dot") << QByteArray("Quorvane.Pelkan.private.") << false << false;
         QTest::newRow("public plus a character") << QByteArray("Quorvane.PelkanX") << false << false;
         QTest::newRow("public minus a character") << QByteArray("Quorvane.Pelka") << false << false;
+        QTest::newRow("public, the last character other") << QByteArray("Quorvane.Pelkam") << false << false;
         QTest::newRow("theme minus a character") << QByteArray("Quorvane.Pelkan.them") << false << false;
         QTest::newRow("same length, other bytes") << QByteArray("Quorvane.Pelkan.tHeme") << false << false;
         QTest::newRow("lower case") << QByteArray("quorvane.pelkan") << false << false;
