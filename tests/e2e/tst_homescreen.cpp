@@ -1,7 +1,6 @@
 #include "homescreensession.h"
 
 #include <QJsonArray>
-#include <QJsonDocument>
 #include <QtTest>
 
 #include <cerrno>
@@ -11,8 +10,7 @@
 
 // Applications run under the reference home screen as wayland clients: what they publish
 // is read off the compositor's side of the connection, and what the home screen does
-// (pressing cover actions, announcing cover status, sending keys) is seen in the
-// application's log.
+// (pressing cover actions, sending keys) is seen in the application's log.
 class tst_HomeScreen : public QObject
 {
     Q_OBJECT
@@ -115,12 +113,6 @@ private Q_SLOTS:
         QCOMPARE(lines, QStringList({ service, "trigger", "0", "image://theme/icon-cover-pause",
                                       service, "trigger", "1", "image://theme/icon-cover-next", "0" }));
 
-        // The cover's status follows the home screen's signal; an unknown one is dropped.
-        session.send(QStringLiteral("coverstatus 7"));
-        session.send(QStringLiteral("coverstatus 2"));
-        QVERIFY(session.waitForLog(QStringLiteral("e2e: cover status 2")));
-        QVERIFY(!session.log().contains(QLatin1String("e2e: cover status 7")));
-
         // The home screen presses the second action: the second action fires, and only it.
         session.send(QStringLiteral("trigger 1"));
         const QJsonObject reply = session.waitForEvent(QStringLiteral("triggered"));
@@ -134,93 +126,6 @@ private Q_SLOTS:
         QCOMPARE(reply.value(QLatin1String("error")).toString(), QString());
         QVERIFY(session.waitForLog(QStringLiteral("e2e: action 1")));
         QVERIFY(!session.log().contains(QLatin1String("e2e: action 0")));
-
-        // The first action switches the list off: its entries leave the window.
-        session.send(QStringLiteral("trigger 0"));
-        QVERIFY(session.waitForLog(QStringLiteral("e2e: action 0")));
-        const QJsonObject emptied = session.waitForEvent(QStringLiteral("coverActions"));
-        QCOMPARE(emptied.value(QLatin1String("actions")).toArray().size(), 0);
-        QVERIFY(!emptied.contains(QLatin1String("error")));
-    }
-
-    void twoActionListsOnOneWindow_data()
-    {
-        QTest::addColumn<int>("press");
-        QTest::addColumn<bool>("secondStaysOnBus");
-        QTest::newRow("second list emptied") << 0 << true;
-        QTest::newRow("second list destroyed") << 1 << false;
-    }
-
-    // The window shows the list enabled last; when it empties or goes, the first one's
-    // buttons come back, and a destroyed list's bus name goes with it.
-    void twoActionListsOnOneWindow()
-    {
-        QFETCH(int, press);
-        QFETCH(bool, secondStaysOnBus);
-        if (!privilegedHere())
-            QSKIP("the home screen must be privileged to press cover actions");
-        HomeScreenSession session;
-        QVERIFY(run(session, { QStringLiteral("lists=2") }));
-        auto shownService = [](const QJsonObject &published) {
-            return published.value(QLatin1String("actions")).toArray().at(0).toObject().value(QLatin1String("service")).toString();
-        };
-        auto showing = [&shownService](const char *id) {
-            return [&shownService, id](const QJsonObject &r) {
-                return r.value(QLatin1String("event")) == QLatin1String("coverActions") && shownService(r).endsWith(QLatin1String(id));
-            };
-        };
-        const QString second = shownService(session.waitFor(showing(".id2")));
-        QVERIFY(!second.isEmpty());
-
-        session.send(QStringLiteral("trigger %1").arg(press));
-        const QJsonObject reply = session.waitForEvent(QStringLiteral("triggered"));
-        QCOMPARE(reply.value(QLatin1String("service")).toString(), second);
-        QCOMPARE(reply.value(QLatin1String("error")).toString(), QString());
-        // Straight from one list's buttons to the other's, with no empty set between (the
-        // second list's set may come again first: the window republishes it when shown).
-        const QJsonObject shown = session.waitFor([&](const QJsonObject &r) {
-            return r.value(QLatin1String("event")) == QLatin1String("coverActions") && shownService(r) != second;
-        });
-        QVERIFY2(shownService(shown).endsWith(QLatin1String(".id1")), qPrintable(QJsonDocument(shown).toJson()));
-        QCOMPARE(shown.value(QLatin1String("actions")).toArray().size(), 2);
-
-        session.send(QStringLiteral("names"));
-        const QJsonArray names = session.waitForEvent(QStringLiteral("names")).value(QLatin1String("names")).toArray();
-        QCOMPARE(names.contains(second), secondStaysOnBus);
-        QCOMPARE(names.size(), secondStaysOnBus ? 2 : 1);
-    }
-
-    void backKey_data()
-    {
-        QTest::addColumn<int>("depth");
-        QTest::addColumn<bool>("lowers");
-        QTest::newRow("one page") << 1 << true;
-        QTest::newRow("two pages") << 2 << false;
-    }
-
-    void backKey()
-    {
-        QFETCH(int, depth);
-        QFETCH(bool, lowers);
-        HomeScreenSession session;
-        QVERIFY(run(session, { QStringLiteral("depth=%1").arg(depth) }));
-        const int application = session.surfaceWith(QStringLiteral("BACKGROUND_VISIBLE"));
-        session.send(QStringLiteral("focus"));
-        QVERIFY(session.waitForLog(QStringLiteral("e2e: active true")));
-
-        session.send(QStringLiteral("key back"));
-        QCOMPARE(session.waitForEvent(QStringLiteral("keySent")).value(QLatin1String("surface")).toInt(), application);
-        if (lowers) {
-            QCOMPARE(session.waitForEvent(QStringLiteral("lower")).value(QLatin1String("surface")).toInt(), application);
-            QVERIFY(!session.log().contains(QLatin1String("e2e: pop")));
-        } else {
-            QVERIFY(session.waitForLog(QStringLiteral("e2e: pop from depth 2")));
-            // Now one page is left: the next Back lowers the window.
-            QVERIFY(session.waitForEvent(QStringLiteral("lower"), 300).isEmpty());
-            session.send(QStringLiteral("key back"));
-            QCOMPARE(session.waitForEvent(QStringLiteral("lower")).value(QLatin1String("surface")).toInt(), application);
-            QCOMPARE(session.log().count(QLatin1String("e2e: pop")), 1);
-        }
     }
 
     // The components on the device: the Back key pops the top page with its statuses in

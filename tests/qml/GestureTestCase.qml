@@ -8,9 +8,21 @@ import PelkanTest 1.0
 // the touch away instead of a release), "second finger" (one comes down after the fourth move
 // and lifts after the seventh) or "two fingers" (the second lifts after the first). Options:
 // steps (10), pace (ms between moves, the mouse events' time stamps), moving(i) before each
-// move (true ends the moves there), released() just before the finger lifts.
+// move (true ends the moves there), released() just before the finger lifts. findItem()
+// gives the first item in a tree (its root first, then depth first) that matches.
 TestCase {
     when: windowShown
+
+    function findItem(item, matches) {
+        if (matches(item))
+            return item
+        for (var i = 0; i < item.children.length; ++i) {
+            var found = findItem(item.children[i], matches)
+            if (found)
+                return found
+        }
+        return null
+    }
 
     function swipe(item, input, x0, y0, x1, y1, options) {
         var o = options || {}

@@ -30,9 +30,8 @@ Item {
 
     ListItem { id: themed; x: 400; width: 400 }
 
-    TestCase {
+    GestureTestCase {
         name: "ListItem"
-        when: windowShown
 
         function row(i) { return view.itemAtIndex(i) }
 
@@ -118,7 +117,7 @@ Item {
             themed.description = data.description || ""
             themed.iconSource = data.icon || ""
             compare(themed.height, data.height)
-            var label = findChild(themed, "", function(child) { return child.text === data.text && child.font !== undefined })
+            var label = findItem(themed, function(child) { return child.text === data.text && child.font !== undefined })
             verify(label, "the text is drawn")
             var at = label.mapToItem(themed, 0, 0)
             if (data.right !== undefined)
@@ -130,18 +129,6 @@ Item {
             compare(String(label.color), String(themed.palette.highlightColor))
             themed.highlighted = false
             themed.LayoutMirroring.enabled = false
-        }
-
-        function findChild(item, unused, matches) {
-            for (var i = 0; i < item.children.length; ++i) {
-                var child = item.children[i]
-                if (matches(child))
-                    return child
-                var found = findChild(child, unused, matches)
-                if (found)
-                    return found
-            }
-            return null
         }
     }
 }

@@ -3,7 +3,8 @@ import QtTest 1.2
 import Quorvane.Pelkan 1.0
 
 // The page stack through its public surface: moves made by calls and by swipes (real mouse
-// and touch events), alone and in quick succession, the statuses they leave, and dialogs.
+// and touch events), alone and in quick succession, the statuses they leave, and dialogs;
+// what a page gives an application: its window, and the focus it gave a field meanwhile.
 Item {
     id: root
     width: 400; height: 600
@@ -33,6 +34,16 @@ Item {
                 last = status
             }
             MouseArea { anchors.fill: parent } // content that takes presses, as a list does
+        }
+    }
+
+    // A page is a focus scope: the focus given to a field while the page becomes active stays.
+    Component {
+        id: formPage
+        Page {
+            property alias field: titleField
+            onStatusChanged: if (status === PageStatus.Active) titleField.forceActiveFocus()
+            TextField { id: titleField; label: "Title" }
         }
     }
 
@@ -168,6 +179,25 @@ Item {
                     verify(!p.visible && p.status === PageStatus.Inactive, p.name)
                 return false
             })
+        }
+
+        function test_formPage_data() {
+            return [ { tag: "immediate", operation: PageStackAction.Immediate },
+                     { tag: "animated", operation: PageStackAction.Animated } ]
+        }
+
+        function test_formPage(data) {
+            var page = stack.push(formPage, {}, data.operation)
+            tryCompare(page, "status", PageStatus.Active)
+            wait(50) // a turn for anything that would take the focus back
+            verify(page.field.activeFocus, "the field keeps the focus it was given")
+            keyClick(Qt.Key_A)
+            keyClick(Qt.Key_B)
+            compare(page.field.text, "ab")
+            compare(page.applicationWindow, app)
+            var loose = formPage.createObject(root)
+            compare(loose.applicationWindow, null) // outside a window
+            loose.destroy()
         }
 
         function test_dialog_data() {

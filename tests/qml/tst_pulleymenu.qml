@@ -213,8 +213,8 @@ Item {
         // the list is back; a tap cancels it.
         function test_galleryListsPage() {
             var page = app.pageStack.push(Qt.resolvedUrl("../../examples/gallery/qml/ListsPage.qml"), {}, PageStackAction.Immediate)
-            var view = findItem(page, ListView)
-            var popup = findItem(page, RemorsePopup)
+            var view = findItem(page, function(item) { return item instanceof ListView })
+            var popup = findItem(page, function(item) { return item instanceof RemorsePopup })
             var menu = view.pullDownMenu
             var rows = view.count
             verify(menu && popup && rows > 0)
@@ -231,17 +231,6 @@ Item {
         function cleanup() {
             while (app.pageStack.depth > 1)
                 app.pageStack.pop(PageStackAction.Immediate)
-        }
-
-        function findItem(item, type) {
-            if (item instanceof type)
-                return item
-            for (var i = 0; i < item.children.length; ++i) {
-                var found = findItem(item.children[i], type)
-                if (found)
-                    return found
-            }
-            return null
         }
     }
 }

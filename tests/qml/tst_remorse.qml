@@ -43,22 +43,13 @@ Item {
         }
     }
 
-    TestCase {
+    GestureTestCase {
         name: "Remorse"
-        when: windowShown
 
         readonly property int timeout: 900
 
         property ListView list: view
         function row(i) { return list.itemAtIndex(i) }
-
-        function overlay(item) {
-            for (var i = 0; i < item.children.length; ++i) {
-                if (item.children[i] instanceof RemorseItem)
-                    return item.children[i]
-            }
-            return null
-        }
 
         function init() {
             root.log = []
@@ -107,7 +98,7 @@ Item {
                 // The countdown is on its row, with the time it had.
                 compare(countdown.row, data.at)
                 tryVerify(function() { return row(data.at).remorseRunning })
-                var shown = overlay(row(data.at))
+                var shown = findItem(row(data.at), function(item) { return item instanceof RemorseItem })
                 var left = timeout - (Date.now() - started)
                 verify(Math.abs(countdown.remaining() - left) < 250, countdown.remaining() + " ms left, not " + left)
                 tryCompare(shown, "secondsLeft", Math.ceil(countdown.remaining() / 1000))

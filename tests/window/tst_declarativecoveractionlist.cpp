@@ -343,6 +343,8 @@ private Q_SLOTS:
         if (shown < 0) {
             QCOMPARE(published, QString());
         } else {
+            // Straight from one list's entries to the other's, never an empty set between.
+            QVERIFY(!m_payloads.contains(QString()));
             const QStringList lines = published.split(QLatin1Char('\n'));
             QCOMPARE(lines.size(), 9);
             QCOMPARE(lines.at(0), lists.at(shown)->serviceName());

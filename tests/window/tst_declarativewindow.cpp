@@ -1,11 +1,18 @@
 #include "../common/configfixture.h"
+#include "window/declarativecover.h"
+#include "window/declarativecoverwindow.h"
 #include "window/declarativewindow.h"
 #include "screen.h"
+#include "theme.h"
 #include "window/windoweventobserver.h"
 #include "window/windowpropertypublisher.h"
 
+#include <QDBusConnection>
+#include <QDBusMessage>
 #include <QQuickWindow>
 #include <QtTest>
+
+#include <cmath>
 
 using O = DeclarativeOrientation;
 
@@ -35,8 +42,11 @@ protected:
 struct PublishedProperty {
     QString name;
     QVariant value;
+    QWindow *window;
 };
 
+// The application window: orientation, configuration read at start (with the screen's size
+// category it depends on), events, publications to the home screen, the cover and its window.
 class tst_DeclarativeWindow : public QObject
 {
     Q_OBJECT
@@ -46,6 +56,7 @@ private Q_SLOTS:
     {
         QVERIFY(ConfigFixture::reset(AngleKey));
         QVERIFY(ConfigFixture::reset(AllowedKey));
+        QVERIFY(ConfigFixture::reset(DiagonalKey));
         m_published.clear();
     }
 
@@ -156,6 +167,46 @@ private Q_SLOTS:
         QCOMPARE(window.deviceOrientation(), O::Landscape);
         QCOMPARE(window.orientation(), O::Landscape);
         QCOMPARE(allowedChanged.count() + deviceChanged.count(), 0);
+    }
+
+    void sizeCategoryForDiagonal_data()
+    {
+        QTest::addColumn<qreal>("inches");
+        QTest::addColumn<int>("category");
+        QTest::newRow("just below medium") << 4.49 << int(Pelkan::Screen::Small);
+        QTest::newRow("medium starts") << 4.5 << int(Pelkan::Screen::Medium);
+        QTest::newRow("large starts") << 7.0 << int(Pelkan::Screen::Large);
+        QTest::newRow("extra large starts") << 11.0 << int(Pelkan::Screen::ExtraLarge);
+        QTest::newRow("monitor") << 24.0 << int(Pelkan::Screen::ExtraLarge);
+    }
+
+    void sizeCategoryForDiagonal()
+    {
+        QFETCH(qreal, inches);
+        QFETCH(int, category);
+        QCOMPARE(int(Pelkan::Screen::categoryForDiagonal(inches)), category);
+    }
+
+    // A configured diagonal overrides the display's and moves the size category; an
+    // unusable one gives the display's own measurement back.
+    void configuredDiagonal()
+    {
+        using Pelkan::Screen;
+        const qreal display = Screen().diagonal();
+        Screen screen;
+        QVERIFY(ConfigFixture::write(DiagonalKey, QStringLiteral("5.5")));
+        QTRY_COMPARE(screen.diagonal(), 5.5);
+        QCOMPARE(screen.sizeCategory(), Screen::Medium);
+
+        QSignalSpy changed(&screen, &Screen::sizeCategoryChanged);
+        QVERIFY(ConfigFixture::write(DiagonalKey, QStringLiteral("10.0")));
+        QTRY_COMPARE(changed.count(), 1);
+        QCOMPARE(screen.sizeCategory(), Screen::Large);
+        QTRY_COMPARE(Screen::instance()->sizeCategory(), Screen::Large);
+
+        QTest::ignoreMessage(QtWarningMsg, QRegularExpression(QStringLiteral("^Screen: ignoring invalid diagonal")));
+        QVERIFY(ConfigFixture::write(DiagonalKey, QStringLiteral("-3.0")));
+        QTRY_COMPARE(screen.diagonal(), display);
     }
 
     void defaultAllowedOrientations_data()
@@ -308,43 +359,160 @@ private Q_SLOTS:
         QCOMPARE(window->backgroundColor(), QColor(Qt::darkCyan));
     }
 
+    // A cover window finds its cover and publishes each change of its transparency once.
+    // Attached to the application window: the home screen is told, the two pair, the cover
+    // shows while the application is away (or always, as the primary window), and its end
+    // is announced too.
     void coverAttachAndDestroy()
     {
         record(QStringLiteral("wayland"));
         DeclarativeWindow *window = showWindow();
         QVERIFY(window);
         QSignalSpy switcher(window, &DeclarativeWindow::switcherWindowChanged);
-        auto cover = new QQuickWindow;
+        QQuickWindow::setDefaultAlphaBuffer(true);
+        auto coverWindow = new DeclarativeCoverWindow;
+        QQuickWindow::setDefaultAlphaBuffer(false);
+        auto cover = new DeclarativeCover(coverWindow->contentItem());
+        coverWindow->show();
+        QVERIFY(QTest::qWaitForWindowExposed(coverWindow));
+        QCOMPARE(coverWindow->cover(), cover);
+        QCOMPARE(coverWindow->windowReference(), QStringLiteral("__winref:%1").arg(coverWindow->winId()));
+        m_published.clear();
+        cover->setTransparent(true);
+        cover->setTransparent(true);
+        cover->setTransparent(false);
+        QVariantList transparent;
+        for (const PublishedProperty &property : publishedBy(coverWindow)) {
+            if (property.name == QLatin1String("TRANSPARENT"))
+                transparent << property.value;
+        }
+        QCOMPARE(transparent, QVariantList({ true, false }));
+        coverWindow->hide();
 
         m_published.clear();
-        window->_setCover(cover);
-        QCOMPARE(m_published.first().name, QStringLiteral("QUORVANE_RETAIN_COVER"));
-        QCOMPARE(m_published.first().value, QVariant(true));
-        QCOMPARE(m_published.at(3).name, QStringLiteral("QUORVANE_COVER_WINDOW"));
-        QCOMPARE(m_published.at(3).value.toULongLong(), qulonglong(cover->winId()));
+        window->_setCover(coverWindow);
+        QVector<PublishedProperty> own = publishedBy(m_window.data());
+        QCOMPARE(own.first().name, QStringLiteral("QUORVANE_RETAIN_COVER"));
+        QCOMPARE(own.first().value, QVariant(true));
+        QCOMPARE(own.at(3).name, QStringLiteral("QUORVANE_COVER_WINDOW"));
+        QCOMPARE(own.at(3).value.toULongLong(), qulonglong(coverWindow->winId()));
         // The home screen is told there is a cover with the same publication.
-        QCOMPARE(m_published.at(4).name, QStringLiteral("QUORVANE_HAVE_COVER"));
-        QCOMPARE(m_published.at(4).value, QVariant(true));
+        QCOMPARE(own.at(4).name, QStringLiteral("QUORVANE_HAVE_COVER"));
+        QCOMPARE(own.at(4).value, QVariant(true));
         QCOMPARE(switcher.count(), 1);
-        QCOMPARE(switcher.last().first().value<QQuickWindow *>(), cover);
+        QCOMPARE(switcher.last().first().value<QQuickWindow *>(), coverWindow);
+        QCOMPARE(coverWindow->mainWindow(), window);
 
         // The application is in the foreground: its cover is not on show until it leaves.
         QVERIFY(!window->coverVisible());
         m_window->hide();
         QVERIFY(window->coverVisible());
+        QTRY_VERIFY(coverWindow->isVisible());
         window->setCoverIsPrimaryWindow(true);
         m_window->show();
         QVERIFY(window->coverVisible());
 
         m_published.clear();
-        delete cover;
+        delete coverWindow;
         QVERIFY(!window->coverWindow());
-        QCOMPARE(m_published.first().name, QStringLiteral("QUORVANE_RETAIN_COVER"));
-        QCOMPARE(m_published.first().value, QVariant(false));
-        QCOMPARE(m_published.at(4).value, QVariant(false));
+        own = publishedBy(m_window.data());
+        QCOMPARE(own.first().name, QStringLiteral("QUORVANE_RETAIN_COVER"));
+        QCOMPARE(own.first().value, QVariant(false));
+        QCOMPARE(own.at(4).value, QVariant(false));
         QVERIFY(!window->haveCoverHint());
         QVERIFY(!window->coverVisible());
         QCOMPARE(switcher.count(), 2);
+    }
+
+    void statusFromHomeScreen_data()
+    {
+        QTest::addColumn<int>("sent");
+        QTest::addColumn<int>("expected");
+        QTest::newRow("activating") << 1 << int(DeclarativeCover::Activating);
+        QTest::newRow("active") << 2 << int(DeclarativeCover::Active);
+        QTest::newRow("deactivating") << 3 << int(DeclarativeCover::Deactivating);
+        QTest::newRow("inactive") << 0 << int(DeclarativeCover::Inactive);
+    }
+
+    // The status follows the home screen's signal, once for a repeat; an unknown status
+    // leaves it as it is.
+    void statusFromHomeScreen()
+    {
+        QFETCH(int, sent);
+        QFETCH(int, expected);
+        DeclarativeCover cover;
+        if (sent == 0)
+            cover.setStatus(DeclarativeCover::Active);
+        QSignalSpy changed(&cover, &DeclarativeCover::statusChanged);
+        sendStatus(sent);
+        sendStatus(sent);
+        QTest::ignoreMessage(QtWarningMsg, QRegularExpression(QStringLiteral("setStatus\\(int\\).*invalid status: 7")));
+        sendStatus(7);
+        QTRY_COMPARE(int(cover.status()), expected);
+        QTest::qWait(100);
+        QCOMPARE(int(cover.status()), expected);
+        QCOMPARE(changed.count(), 1);
+    }
+
+    void resizeWithinPermission()
+    {
+        DeclarativeCover cover;
+        const QSize small = Pelkan::Theme::instance()->coverSizeSmall();
+        QCOMPARE(cover.size(), DeclarativeCover::Large);
+        QSignalSpy size(&cover, &DeclarativeCover::sizeChanged);
+        cover.requestResize(small.width(), small.height());
+        QCOMPARE(cover.size(), DeclarativeCover::Large);
+
+        cover.setAllowResize(true);
+        cover.requestResize(small.width(), small.height());
+        QCOMPARE(cover.size(), DeclarativeCover::Small);
+        QCOMPARE(QSizeF(cover.width(), cover.height()), QSizeF(small));
+        cover.tryResize(small.width() + 1, small.height(), true);
+        QCOMPARE(cover.size(), DeclarativeCover::Large);
+        QCOMPARE(size.count(), 2);
+    }
+
+    void actionArea_data()
+    {
+        Pelkan::Theme *theme = Pelkan::Theme::instance();
+        const qreal large = theme->coverSizeLarge().width();
+        QTest::addColumn<qreal>("width");
+        QTest::addColumn<qreal>("expectedHeight");
+        QTest::newRow("large cover") << large << qMin<qreal>(int(theme->itemSizeSmall()), std::round(large * 0.5));
+        QTest::newRow("half size") << large / 2 << qMin<qreal>(int(theme->itemSizeSmall() * 0.5), std::round(large * 0.25));
+        // The small item size is under half the large cover's width, so scaling keeps the
+        // strip below half of any cover's width; a narrow cover scales it down likewise.
+        QTest::newRow("narrow") << 21.0 << qreal(int(theme->itemSizeSmall() * 21.0 / large));
+    }
+
+    void actionArea()
+    {
+        QFETCH(qreal, width);
+        QFETCH(qreal, expectedHeight);
+        DeclarativeCover cover;
+        cover.setSize(QSizeF(width, 400));
+        QQuickItem *area = cover.coverActionArea();
+        QCOMPARE(area->width(), width);
+        QCOMPARE(area->height(), expectedHeight);
+        QCOMPARE(area->y(), 400 - expectedHeight);
+        // A taller cover keeps the strip at its foot.
+        cover.setHeight(450);
+        QCOMPARE(area->height(), expectedHeight);
+        QCOMPARE(area->y(), 450 - expectedHeight);
+    }
+
+    void coverWindowWithoutAlphaIsBlack()
+    {
+        QTest::ignoreMessage(QtWarningMsg, QRegularExpression(QStringLiteral("^DeclarativeCoverWindow: You should be calling")));
+        QTest::ignoreMessage(QtWarningMsg, "DeclarativeCoverWindow: You also won't have cover transparency.");
+        DeclarativeCoverWindow opaque;
+        QCOMPARE(opaque.color(), QColor(Qt::black));
+        QVERIFY(opaque.flags() & Qt::CoverWindow);
+
+        QQuickWindow::setDefaultAlphaBuffer(true);
+        DeclarativeCoverWindow clear;
+        QCOMPARE(clear.color(), QColor(Qt::transparent));
+        QQuickWindow::setDefaultAlphaBuffer(false);
     }
 
     void queuedDeletionWaitsForAFrame()
@@ -368,10 +536,25 @@ private Q_SLOTS:
 
 private:
     DeclarativeWindow *showWindow();
+    static void sendStatus(int status)
+    {
+        QDBusMessage signal = QDBusMessage::createSignal(QStringLiteral("/com/kavoa/trevanel"),
+                                                         QStringLiteral("com.kavoa.trevanel"), QStringLiteral("coverstatus"));
+        signal << status;
+        QVERIFY(QDBusConnection::sessionBus().send(signal));
+    }
+
+    QVector<PublishedProperty> publishedBy(QWindow *window) const
+    {
+        QVector<PublishedProperty> own;
+        std::copy_if(m_published.cbegin(), m_published.cend(), std::back_inserter(own),
+                     [window](const PublishedProperty &property) { return property.window == window; });
+        return own;
+    }
     void record(const QString &platform)
     {
-        WindowPropertyPublisher::setSinkForTesting([this](QWindow *, const QString &name, const QVariant &value) {
-            m_published.append({ name, value });
+        WindowPropertyPublisher::setSinkForTesting([this](QWindow *window, const QString &name, const QVariant &value) {
+            m_published.append({ name, value, window });
         }, platform);
     }
     QScopedPointer<QQuickWindow> m_window;

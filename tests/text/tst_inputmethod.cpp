@@ -7,7 +7,9 @@
 #include <QQuickWindow>
 #include <QtTest>
 
-class tst_DeclarativeEnterKey : public QObject
+// The Enter key and the pre-edit against a real input context: the test plugin composes
+// what a test asks for and counts the updates the application asks of it.
+class tst_InputMethod : public QObject
 {
     Q_OBJECT
 
@@ -143,16 +145,110 @@ private Q_SLOTS:
         QCOMPARE(changed.count(), 1);
     }
 
+    void composingInsertsAtTheCursor()
+    {
+        QVERIFY(startEditing());
+        QSignalSpy changed(m_preedit, &DeclarativePreeditText::textChanged);
+        QCOMPARE(m_preedit->text(), QStringLiteral("hello"));
+        QMetaObject::invokeMethod(m_context, "compose", Q_ARG(QString, QStringLiteral("ab")));
+        QVERIFY(m_field->property("inputMethodComposing").toBool());
+        QCOMPARE(m_field->property("text").toString(), QStringLiteral("hello"));
+        // "ab" inserted before the fourth character of "hello".
+        QCOMPARE(m_preedit->text(), QStringLiteral("helablo"));
+        QVERIFY(changed.count() > 0);
+
+        // Focus gone: the keyboard's pre-edit no longer reaches this object.
+        m_field->setFocus(false);
+        changed.clear();
+        QMetaObject::invokeMethod(m_context, "compose", Q_ARG(QString, QStringLiteral("x")));
+        QCOMPARE(changed.count(), 0);
+    }
+
+    void writing_data()
+    {
+        QTest::addColumn<bool>("same");
+        QTest::newRow("other text: the composition is committed first") << false;
+        QTest::newRow("the same text: the composition goes on") << true;
+    }
+
+    void writing()
+    {
+        QFETCH(bool, same);
+        QVERIFY(startEditing());
+        QMetaObject::invokeMethod(m_context, "compose", Q_ARG(QString, QStringLiteral("ab")));
+        const QString text = same ? m_preedit->text() : QStringLiteral("replaced");
+        m_preedit->setText(text);
+        QCOMPARE(m_context->property("preedit").toString(), same ? QStringLiteral("ab") : QString());
+        QCOMPARE(m_field->property("inputMethodComposing").toBool(), same);
+        QCOMPARE(m_field->property("text").toString(), same ? QStringLiteral("hello") : text);
+        QCOMPARE(m_preedit->text(), text);
+    }
+
+    void withoutEditor()
+    {
+        DeclarativePreeditText loose;
+        QTest::ignoreMessage(QtInfoMsg, QRegularExpression(QStringLiteral("setting text property without target editor")));
+        loose.setText(QStringLiteral("x"));
+        QCOMPARE(loose.text(), QString());
+    }
+
+    void parentThatIsNoEditor_data()
+    {
+        QTest::addColumn<QByteArray>("parent");
+        QTest::addColumn<QString>("text");
+        QTest::newRow("an item without text") << QByteArray("Item {") << QString();
+        QTest::newRow("an object with text but no focus") << QByteArray("QtObject { property string text: 'abc';") << "abc";
+    }
+
+    // Placed where there is no editor, it reads what it can and says nothing.
+    void parentThatIsNoEditor()
+    {
+        QFETCH(QByteArray, parent);
+        QFETCH(QString, text);
+        static int messages;
+        messages = 0;
+        QtMessageHandler previous = qInstallMessageHandler([](QtMsgType type, const QMessageLogContext &, const QString &) {
+            if (type != QtDebugMsg)
+                ++messages;
+        });
+        QQmlComponent component(&m_engine);
+        component.setData("import QtQuick 2.6\nimport Quorvane.Pelkan.private 1.0\n" + parent
+                                  + " property PreeditText preedit: PreeditText {} }\n", QUrl());
+        QScopedPointer<QObject> object(component.create());
+        qInstallMessageHandler(previous);
+        QVERIFY2(object, qPrintable(component.errorString()));
+        QCOMPARE(messages, 0);
+        QCOMPARE(object->property("preedit").value<DeclarativePreeditText *>()->text(), text);
+    }
+
 private:
     QQuickItem *load(const QByteArray &body);
+    // A focused field holding "hello", the cursor after its third character, with a pre-edit.
+    bool startEditing()
+    {
+        m_field = load("TextInput { width: 200; height: 40; text: 'hello'\n"
+                       "  property alias preedit: preedit\n"
+                       "  Private.PreeditText { id: preedit } }");
+        m_context = DeclarativePreeditText::platformInputContext();
+        if (!m_field || !m_context || m_context->metaObject()->indexOfMethod("compose(QString)") < 0)
+            return false;
+        m_preedit = m_field->property("preedit").value<DeclarativePreeditText *>();
+        m_field->forceActiveFocus();
+        m_field->setProperty("cursorPosition", 3);
+        return QTest::qWaitFor([this] { return m_field->hasActiveFocus(); });
+    }
+
     QQmlEngine m_engine;
     QScopedPointer<QQuickWindow> m_window;
+    QQuickItem *m_field = nullptr;
+    DeclarativePreeditText *m_preedit = nullptr;
+    QObject *m_context = nullptr;
 };
 
-QQuickItem *tst_DeclarativeEnterKey::load(const QByteArray &body)
+QQuickItem *tst_InputMethod::load(const QByteArray &body)
 {
     QQmlComponent component(&m_engine);
-    component.setData("import QtQuick 2.6\nimport Quorvane.Pelkan 1.0\n" + body, QUrl());
+    component.setData("import QtQuick 2.6\nimport Quorvane.Pelkan 1.0\nimport Quorvane.Pelkan.private 1.0 as Private\n" + body, QUrl());
     auto root = qobject_cast<QQuickItem *>(component.create());
     if (!root) {
         qWarning() << component.errorString();
@@ -169,5 +265,5 @@ QQuickItem *tst_DeclarativeEnterKey::load(const QByteArray &body)
     return root;
 }
 
-QTEST_MAIN(tst_DeclarativeEnterKey)
-#include "tst_declarativeenterkey.moc"
+QTEST_MAIN(tst_InputMethod)
+#include "tst_inputmethod.moc"
