@@ -21,8 +21,10 @@ make_tree() {
     printf 'const char *document = "import QtQml 2.0;import %%1 %%2.%%3;QtObject {}";\n' > "$scratch/tree/src/stack.cpp"
     printf 'const char *peer = "import QtQuick 2.6\\nimport org.kde.kirigami 2.10 as Kirigami\\n";\n' > "$scratch/tree/benchmarks/main.cpp"
     printf '#!/bin/sh\n# mmdebstrap in a comment is no call\ndbus-run-session -- xvfb-run -a true\n' > "$scratch/tree/scripts/run"
-    # Named before scripts/run, neither calls xvfb-run: a pattern and another language.
-    printf '#!/bin/sh\ngrep -E '"'"'xvfb-run|true'"'"' "$1"\n' > "$scratch/tree/scripts/patterns"
+    # Named before scripts/run, neither calls xvfb-run: a pattern, a message, a here-document
+    # and another language.
+    printf '#!/bin/sh\ngrep -E '"'"'xvfb-run|true'"'"' "$1"\necho "xvfb-run is needed"\ncat <<EOF\nxvfb-run\nEOF\n' \
+        > "$scratch/tree/scripts/patterns"
     printf '#!/usr/bin/env python3\nprint("xvfb-run")\n' > "$scratch/tree/scripts/a-tool"
 }
 
