@@ -5,7 +5,8 @@ import Quorvane.Pelkan.private 1.0 as Private
 
 // Sliding views with real drags: where a release settles, the joined ends, the items the
 // cache keeps alive (counted), the attached values during a slide, tabs, which of the view
-// and the page stack takes a swipe, the sources and model edits a view follows.
+// (or a slider's drag filter) and the page stack takes a swipe, the sources and model edits
+// a view follows.
 Item {
     id: root
     width: 400; height: 800
@@ -59,6 +60,14 @@ Item {
                 anchors.fill: parent; model: 3
                 delegate: Item {}
             }
+        }
+    }
+    // A slider whose drag filter claims the orientations given.
+    Component {
+        id: pageWithSlider
+        Page {
+            property alias slider: slider
+            MouseArea { id: slider; y: 100; width: parent.width; height: 60 }
         }
     }
 
@@ -156,10 +165,13 @@ Item {
         }
 
         // At the view's first item the back swipe is the page stack's; further in, the view's.
+        // A slider keeps a sideways drag when its drag filter claims it; the page goes otherwise.
         function test_backSwipe_data() {
             return [
                 { tag: "first item: the page goes", index: 0, depth: 1 },
                 { tag: "second item: the view slides", index: 1, depth: 2 },
+                { tag: "slider claiming sideways drags", orientations: Qt.Horizontal, depth: 2 },
+                { tag: "slider claiming up and down only", orientations: Qt.Vertical, depth: 1 },
             ]
         }
 
@@ -167,12 +179,16 @@ Item {
             var stack = app.pageStack
             stack.clear()
             stack.push(pageWithView, {}, PageStackAction.Immediate)
-            var inner = stack.push(pageWithView, {}, PageStackAction.Immediate).view
-            inner.moveTo(data.index, TabViewAction.Immediate)
+            var top = stack.push(data.orientations ? pageWithSlider : pageWithView, {}, PageStackAction.Immediate)
+            var inner = top.view
+            if (data.orientations)
+                top.slider.Private.DragFilter.orientations = data.orientations
+            else
+                inner.moveTo(data.index, TabViewAction.Immediate)
             swipe(stack, "mouse", 20, 130, 300, 130, { steps: 12, pace: 16 })
             tryCompare(stack, "busy", false)
             compare(stack.depth, data.depth)
-            if (data.depth === 2) {
+            if (inner && data.depth === 2) {
                 tryCompare(inner, "moving", false)
                 compare(inner.currentIndex, 0)
             }

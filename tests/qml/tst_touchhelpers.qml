@@ -1,9 +1,8 @@
 import QtQuick 2.6
 import QtTest 1.2
 import Quorvane.Pelkan 1.0
-import Quorvane.Pelkan.private 1.0 as Private
 
-// TouchBlocker, InverseMouseArea and DragFilter with real presses.
+// TouchBlocker and InverseMouseArea with real presses (DragFilter: tst_slideable).
 Item {
     id: root
     width: 400; height: 600
@@ -40,26 +39,6 @@ Item {
         }
     }
     Item { id: opener; x: 300; y: 500; width: 100; height: 100 }
-
-    ApplicationWindow {
-        id: app
-        x: 0; y: 0; width: 400; height: 600
-        visible: false
-    }
-
-    Component {
-        id: sliderPage
-        Page {
-            property alias slider: slider
-            MouseArea {
-                id: slider
-                property int moves: 0
-                y: 200; width: parent.width; height: 100
-                Private.DragFilter.orientations: Qt.Horizontal
-                onPositionChanged: moves++
-            }
-        }
-    }
 
     GestureTestCase {
         name: "TouchHelpers"
@@ -101,27 +80,6 @@ Item {
             compare(button.clicks, data.clicks, "the press is not taken")
             verify(!outside.pressed)
             outside.enabled = true
-        }
-
-        function test_dragFilter_data() {
-            return [
-                { tag: "claimed sideways", orientations: Qt.Horizontal, depth: 2 },
-                { tag: "claimed up and down only", orientations: Qt.Vertical, depth: 1 },
-            ]
-        }
-
-        // A slider on a page keeps its sideways drag; the page goes with any other.
-        function test_dragFilter(data) {
-            app.visible = true
-            var stack = app.pageStack
-            stack.clear()
-            stack.push(sliderPage, {}, PageStackAction.Immediate)
-            var page = stack.push(sliderPage, {}, PageStackAction.Immediate)
-            page.slider.Private.DragFilter.orientations = data.orientations
-            swipe(stack, "mouse", 20, 250, 340, 250, { steps: 16 })
-            tryCompare(stack, "busy", false)
-            compare(stack.depth, data.depth)
-            app.visible = false
         }
     }
 }

@@ -330,6 +330,11 @@ private Q_SLOTS:
         const QImage tinted = render(line, tint, false);
         for (int x = 0; x < 9; ++x)
             QCOMPARE(bytesAt(tinted, x, 0), x == 4 || x == 6 || x == 8 ? expected : rgba(0, 0, 0, 0));
+
+        // For ARGB32 the same pixel, its red and blue in their places there.
+        const QImage argb = ThemePixels::renderArgb32(source, tint);
+        QCOMPARE(argb.format(), QImage::Format_ARGB32_Premultiplied);
+        QCOMPARE(argb.pixel(0, 0), qRgba(uchar(expected[0]), uchar(expected[1]), uchar(expected[2]), uchar(expected[3])));
     }
 
     void pixelsBorderRepeatsTheEdges()
@@ -345,15 +350,6 @@ private Q_SLOTS:
         for (int y = 0; y < 4; ++y)
             for (int x = 0; x < 4; ++x)
                 QCOMPARE(int(uchar(bytesAt(image, x, y).at(3))), expected[y][x]);
-    }
-
-    void pixelsArgb32SwapsRedAndBlue()
-    {
-        QImage source(1, 1, QImage::Format_ARGB32);
-        source.setPixel(0, 0, qRgba(0, 0, 0, 255));
-        const QImage image = ThemePixels::renderArgb32(source, QColor(255, 10, 0));
-        QCOMPARE(image.format(), QImage::Format_ARGB32_Premultiplied);
-        QCOMPARE(image.pixel(0, 0), qRgba(255, 10, 0, 255));
     }
 
     void atlasSide_data()
@@ -377,54 +373,46 @@ private Q_SLOTS:
         QCOMPARE(ThemeTextureAtlas::sideFor(window, maximum), side);
     }
 
+    // Images at least half the atlas wide or high get a texture of their own, as do those
+    // that no longer fit; freed, the first one's place takes it again.
     void atlasPlacement_data()
     {
-        QTest::addColumn<QSize>("image");
-        QTest::addColumn<bool>("inAtlas");
-        QTest::newRow("small") << QSize(32, 32) << true;
-        QTest::newRow("just under half") << QSize(255, 10) << true;
-        QTest::newRow("exactly half wide") << QSize(256, 10) << false;
-        QTest::newRow("exactly half high") << QSize(10, 256) << false;
+        QTest::addColumn<QList<QSize>>("images");
+        QTest::addColumn<QList<bool>>("inAtlas");
+        QTest::newRow("small") << QList<QSize> { { 32, 32 } } << QList<bool> { true };
+        QTest::newRow("just under half") << QList<QSize> { { 255, 10 } } << QList<bool> { true };
+        QTest::newRow("exactly half wide") << QList<QSize> { { 256, 10 } } << QList<bool> { false };
+        QTest::newRow("exactly half high") << QList<QSize> { { 10, 256 } } << QList<bool> { false };
+        const QSize quarter(200, 200); // two by two fit in 512
+        QTest::newRow("full: freed space used again") << QList<QSize> { quarter, quarter, quarter, quarter, quarter }
+                                                      << QList<bool> { true, true, true, true, false };
     }
 
     void atlasPlacement()
     {
-        QFETCH(QSize, image);
-        QFETCH(bool, inAtlas);
+        QFETCH(QList<QSize>, images);
+        QFETCH(QList<bool>, inAtlas);
         const Pelkan::ThemeIconResolver resolver(QStringLiteral("/nonexistent"), 1.0);
         ThemeTextureAtlas atlas(resolver, 512);
-        ThemeImageRecord record;
-        record.imageSize = image;
-        QImage bordered(image + QSize(2, 2), QImage::Format_RGBA8888_Premultiplied);
-        QScopedPointer<QSGTexture> texture(atlas.create(record, QString(), bordered));
-        QCOMPARE(texture->isAtlasTexture(), inAtlas);
-        QCOMPARE(texture->textureSize(), image);
-        if (inAtlas) {
-            // The sub-rectangle covers the image inside its one-pixel border.
-            const QRectF sub = texture->normalizedTextureSubRect();
-            QCOMPARE(sub.size(), QSizeF(image.width() / 512.0, image.height() / 512.0));
-            QVERIFY(sub.left() >= 1 / 512.0 && sub.top() >= 1 / 512.0);
-        }
-    }
-
-    void fullAtlasGoesStandalone()
-    {
-        const Pelkan::ThemeIconResolver resolver(QStringLiteral("/nonexistent"), 1.0);
-        ThemeTextureAtlas atlas(resolver, 512);
-        ThemeImageRecord record;
-        record.imageSize = QSize(200, 200);
-        const QImage bordered(202, 202, QImage::Format_RGBA8888_Premultiplied);
         std::vector<std::unique_ptr<QSGTexture>> textures;
-        for (int i = 0; i < 4; ++i) // two by two fit in 512
-            textures.emplace_back(atlas.create(record, QString(), bordered));
-        QVERIFY(textures.back()->isAtlasTexture());
-        textures.emplace_back(atlas.create(record, QString(), bordered));
-        QVERIFY(!textures.back()->isAtlasTexture());
-        QCOMPARE(atlas.standaloneCount(), 1);
-        // Freed space is used again.
-        textures.erase(textures.begin());
-        textures.emplace_back(atlas.create(record, QString(), bordered));
-        QVERIFY(textures.back()->isAtlasTexture());
+        for (int i = 0; i <= images.size(); ++i) {
+            if (i == images.size())
+                textures.erase(textures.begin());
+            const QSize image = images.at(i % images.size());
+            ThemeImageRecord record;
+            record.imageSize = image;
+            textures.emplace_back(atlas.create(record, QString(), QImage(image + QSize(2, 2), QImage::Format_RGBA8888_Premultiplied)));
+            QSGTexture *texture = textures.back().get();
+            QCOMPARE(texture->isAtlasTexture(), inAtlas.at(i % images.size()));
+            QCOMPARE(texture->textureSize(), image);
+            if (texture->isAtlasTexture()) {
+                // The sub-rectangle covers the image inside its one-pixel border.
+                const QRectF sub = texture->normalizedTextureSubRect();
+                QCOMPARE(sub.size(), QSizeF(image.width() / 512.0, image.height() / 512.0));
+                QVERIFY(sub.left() >= 1 / 512.0 && sub.top() >= 1 / 512.0);
+            }
+        }
+        QCOMPARE(atlas.standaloneCount(), int(inAtlas.count(false)));
     }
 };
 
