@@ -50,7 +50,8 @@ Palette::Palette(QObject *parent)
 
 Palette::~Palette()
 {
-    follow(nullptr);
+    if (m_inherited)
+        m_inherited->m_dependents.removeOne(this);
     ThemePalettes::instance()->remove(this);
     // Those still inheriting from this one follow the theme from now on.
     const QVector<Palette *> dependents = m_dependents;
